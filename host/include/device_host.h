@@ -1,0 +1,53 @@
+/**
+ * @file
+ * @brief An ordinary Linux desktop as the device: starting and observing it.
+ *
+ * Only programs call this; libraries use the interfaces of <device/...>.
+ */
+#pragma once
+
+#include <stddef.h>
+
+#include <device/export.h>
+
+DEVICE_EXTERN_C_BEGIN
+
+/** Where the device keeps things. Every null or empty member means its default. */
+typedef struct {
+    /** Settings and application data. Default: CLOCK_DATA_DIR, else below XDG_DATA_HOME. */
+    const char* data_dir;
+    /** State until the next restart. Default: CLOCK_RUNTIME_DIR, else below XDG_RUNTIME_DIR. */
+    const char* runtime_dir;
+    /** Themes and catalogues. Default: CLOCK_RESOURCE_DIR, else where they were built to. */
+    const char* resource_dir;
+} device_host_config_s;
+
+/**
+ * @brief Prepares the folders and the language; before the toolkit is initialised.
+ *
+ * Creates missing folders, checks that they can be written, sets the locale from the environment
+ * with English as the language of last resort, and binds the text domain "clock" as the default one.
+ * @param config May be null.
+ * @param[out] error Gets one sentence about what is unusable and why; may be null.
+ * @return 0, or a negative number.
+ */
+DEVICE_API int device_host_init(const device_host_config_s* config, char* error,
+                                size_t error_size);
+
+/**
+ * @brief Gives the toolkit the device's look and feel; after elm_init(), before the first window.
+ * @return 0, or a negative number when the theme is missing or the toolkit's date-time functions
+ *         come before the device's in the program's link order.
+ */
+DEVICE_API int device_host_init_toolkit(void);
+
+/** @brief Ends what the two functions above started. */
+DEVICE_API void device_host_shutdown(void);
+
+/** @brief Receives the text of every toast. */
+typedef void (*device_host_toast_cb)(const char* message, void* data);
+
+/** @brief Sets who shows toasts, besides their log line; null for nobody. */
+DEVICE_API void device_host_set_toast_callback(device_host_toast_cb callback, void* data);
+
+DEVICE_EXTERN_C_END
