@@ -1,8 +1,9 @@
 /**
  * @file
- * @brief Civil (wall clock) time and instants, with ICU's time zones.
+ * @brief Civil (wall clock) time and instants, with the time zones of the C library.
  *
- * All arithmetic is done in 64 bits.
+ * All arithmetic is done in 64 bits. Where a function takes a time zone, an unknown one counts as
+ * the current one.
  */
 #pragma once
 
@@ -33,9 +34,16 @@ struct CivilTime {
 
 /**
  * @brief The id of the process's time zone, from TZ or the system's setting.
- * @return An id that ICU knows; "UTC" when there is none.
+ * @return An id of the time-zone database, or TZ itself when that is a POSIX rule; "UTC" when there
+ *         is neither.
  */
 std::string currentTimeZone();
+
+/** @brief Whether a text names a time zone. */
+bool isTimeZone(const std::string& timeZone);
+
+/** @brief Seconds that a time zone's clocks are ahead of UTC at an instant. */
+int utcOffset(std::int64_t instant, const std::string& timeZone);
 
 /** @brief The wall clock reading of an instant (epoch seconds) in a time zone. */
 CivilTime toCivil(std::int64_t instant, const std::string& timeZone);

@@ -24,14 +24,14 @@ DEVICE_EXTERN_C_BEGIN
 
 /** When an alarm rings. */
 typedef struct {
-    int32_t alarm_id;  /**< The application's id of the alarm. */
-    int32_t enabled;   /**< 1 = rings, 0 = kept but silent. */
-    int32_t hour;      /**< 0 to 23. */
-    int32_t minute;    /**< 0 to 59. */
-    int32_t weekdays;  /**< Bit 0 Sunday to bit 6 Saturday; 0 = rings once. */
-    int32_t year;      /**< Year of the one ring, or 0 for the next time the clock shows it. */
-    int32_t month;     /**< 1 to 12; used with a year only. */
-    int32_t day;       /**< 1 to 31; used with a year only. */
+    int32_t alarm_id; /**< The application's id of the alarm. */
+    int32_t enabled;  /**< 1 = rings, 0 = kept but silent. */
+    int32_t hour;     /**< 0 to 23. */
+    int32_t minute;   /**< 0 to 59. */
+    int32_t weekdays; /**< Bit 0 Sunday to bit 6 Saturday; 0 = rings once. */
+    int32_t year;     /**< Year of the one ring, or 0 for the next time the clock shows it. */
+    int32_t month;    /**< 1 to 12; used with a year only. */
+    int32_t day;      /**< 1 to 31; used with a year only. */
 } alarm_schedule_s;
 
 /**
