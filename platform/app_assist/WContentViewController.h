@@ -68,13 +68,20 @@ private:
     static void _itemDeletedCb(void* data, Evas_Object* naviframe, void* info);
     /** Asks onPop() once per attempt. @return True when the page goes. */
     bool askToLeave();
+    /** Keeps the item and listens to it. */
+    void adoptItem(WNaviframeController* naviframeController, Elm_Object_Item* item);
     /** Takes the item off the naviframe without asking. */
     void leave();
+    /** Deletes what the page has put into its item, but for the view. */
+    void deleteItemContents();
 
     WWeakPtr<WViewController> _naviframeController;
     Elm_Object_Item* _naviItem = nullptr;
     bool _leaving = false;
     bool _asking = false;
+    /** The item slides out. */
+    bool _popping = false;
+    bool _heardFromToolkit = false;
 };
 
 } // namespace app_assist

@@ -5,6 +5,7 @@
 #pragma once
 
 #include <functional>
+#include <vector>
 
 #include <app_assist/WViewController.h>
 
@@ -39,9 +40,15 @@ protected:
 private:
     friend class WContentViewController;
     static void _backKeyCb(void* data, Evas_Object* naviframe, void* info);
-    /** Called by a page whose item has gone from the stack. */
-    void pageGone();
+    /** Creates the page if need be and puts it on the stack. @return False when a step failed. */
+    bool show(WContentViewController* page);
+    /** Called by a page that goes for good. */
+    void pageGone(const WContentViewController* page);
+    /** Tells the page on top that it is there, unless it knows. */
+    void announceTop();
 
+    std::vector<WWeakPtr<WViewController>> _pages;
+    WWeakPtr<WViewController> _announced;
     std::function<void()> _onEmpty;
 };
 

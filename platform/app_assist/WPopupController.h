@@ -67,6 +67,8 @@ private:
     static void _buttonClickedCb(void* data, Evas_Object* button, void* info);
     static void _backKeyCb(void* data, Evas_Object* popup, void* info);
     void createButtons(Evas_Object* popup);
+    /** Runs a click function and closes the popup unless it says otherwise. */
+    void onButtonClicked(const ClickFunction& clicked);
 
     ContentFunction _content;
     std::vector<Button> _buttons;

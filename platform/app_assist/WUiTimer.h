@@ -5,6 +5,7 @@
 #pragma once
 
 #include <functional>
+#include <memory>
 
 #include <Ecore.h>
 
@@ -28,7 +29,7 @@ public:
     static WWeakPtr<WUiTimer> addTimer(double interval, const Function& function, void* data);
 
     /** @brief Stops a timer that still exists; safe from inside its own function. */
-    static void destroy(WWeakPtr<WUiTimer> timer);
+    static void destroy(const WWeakPtr<WUiTimer>& timer);
 
     WUiTimer(const WUiTimer&) = delete;
     WUiTimer& operator=(const WUiTimer&) = delete;
@@ -38,12 +39,11 @@ private:
     ~WUiTimer();
     static Eina_Bool _timerCb(void* data);
 
-    WLifeToken _life;
+    std::unique_ptr<WLifeToken> _life = std::make_unique<WLifeToken>();
     Function _function;
     void* _data;
     Ecore_Timer* _timer = nullptr;
     bool _firing = false;
-    bool _ended = false;
 };
 
 } // namespace app_assist

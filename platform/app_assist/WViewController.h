@@ -4,6 +4,7 @@
  */
 #pragma once
 
+#include <functional>
 #include <vector>
 
 #include <Evas.h>
@@ -89,18 +90,30 @@ protected:
 
 private:
     friend class WDeferredDeletion;
+    friend class WContentViewController;
+    friend class WNaviframeController;
+    friend class WWindowController;
     static void _viewDeletedCb(void* data, Evas* evas, Evas_Object* view, void* info);
+    /** Takes over what onCreateView() made. @return False when there is no view to go on with. */
+    bool adoptView(Evas_Object* view);
     /** Defers the end of this controller; once. */
     void scheduleEnd();
-    /** Runs onDestroy(), deletes the view and this object. */
+    /** Runs onDestroy(), deletes the view and, unless the application owns it, this object. */
     void finish();
+    void deleteView();
+    /** Ends the attached popups now. */
+    void finishPopups();
 
     WLifeToken _life;
     Evas_Object* _view = nullptr;
     std::vector<WWeakPtr<WViewController>> _popups;
+    /** Takes the view out of its container, between onDestroy() and the view's deletion. */
+    std::function<void()> _detach;
     bool _created = false;
+    bool _stands = false;
     bool _dying = false;
     bool _attached = false;
+    bool _ownedByApplication = false;
 };
 
 } // namespace app_assist

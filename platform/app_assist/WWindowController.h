@@ -34,6 +34,12 @@ protected:
     Evas_Object* onCreateView(Evas_Object* parent, void* param) override;
 
 private:
+    friend class WViewController;
+    /** The controller of the window that shows a canvas; null when there is none. */
+    static WWindowController* ofCanvas(const Evas* canvas);
+    /** Ends what fills the window now. */
+    void finishBase();
+
     std::string _name;
     int _width;
     int _height;

@@ -1,0 +1,30 @@
+/**
+ * @file
+ * @brief Pictures in memory and in files.
+ */
+#pragma once
+
+#include <cstdint>
+#include <string>
+#include <vector>
+
+/** A picture without transparency. */
+struct Picture {
+    int width = 0;
+    int height = 0;
+    std::vector<std::uint32_t> pixels; ///< 0xAARRGGBB, row by row.
+
+    bool empty() const { return pixels.empty(); }
+    bool save(const std::string& path) const;
+    /** Reads a PNG file; empty when it cannot be read. */
+    static Picture load(const std::string& path);
+};
+
+/** What comparePictures() found. */
+struct PictureDifference {
+    double fraction = 1; ///< Part of the pixels that differ; 1 when the sizes do.
+    Picture picture;     ///< Those pixels in red over a dim copy.
+};
+
+/** @param tolerance Greatest difference of a channel that counts as equal. */
+PictureDifference comparePictures(const Picture& actual, const Picture& approved, int tolerance);

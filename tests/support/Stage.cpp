@@ -1,0 +1,118 @@
+#include "support/Stage.h"
+
+#include <cmath>
+#include <cstdlib>
+#include <utility>
+
+#include <Ecore_Evas.h>
+
+#include "app_assist/WContentViewController.h"
+#include "support/VirtualClock.h"
+
+namespace {
+
+constexpr int QUIET_FRAMES = 15;
+
+void renderedCb(void* data, Evas* /*canvas*/, void* /*info*/) {
+    ++*static_cast<int*>(data);
+}
+
+} // namespace
+
+bool Area::insideCircle() const {
+    const double radius = Stage::SIZE / 2.0;
+    for (const int cornerX : {x, x + width}) {
+        for (const int cornerY : {y, y + height}) {
+            if (std::hypot(cornerX - radius, cornerY - radius) > radius) {
+                return false;
+            }
+        }
+    }
+    return true;
+}
+
+Stage::Stage() {
+    _window = std::make_unique<app_assist::WWindowController>("stage", SIZE, SIZE);
+    _window->create(nullptr, nullptr);
+    _naviframe = new app_assist::WNaviframeController;
+    _window->setBaseController(_naviframe);
+    evas_event_callback_add(canvas(), EVAS_CALLBACK_RENDER_FLUSH_POST, renderedCb, _rendered.get());
+    drawBezel();
+    // A window of the buffer engine has the focus for the toolkit only after it was without it.
+    Ecore_Evas* const ee = ecore_evas_ecore_evas_get(canvas());
+    ecore_evas_focus_set(ee, EINA_FALSE);
+    frames(1);
+    ecore_evas_focus_set(ee, EINA_TRUE);
+    frames(2);
+}
+
+Stage::~Stage() {
+    takeDown();
+}
+
+Evas_Object* Stage::window() const {
+    return _window ? _window->getEvasObj() : nullptr;
+}
+
+Evas* Stage::canvas() const {
+    return evas_object_evas_get(window());
+}
+
+void Stage::push(app_assist::WContentViewController* page) {
+    _naviframe->push(page);
+    settle(2);
+}
+
+void Stage::takeDown() {
+    if (!_window) {
+        return;
+    }
+    _naviframe = nullptr;
+    _window.reset();
+    frames(3);
+}
+
+void Stage::frames(int count) {
+    VirtualClock::frames(count);
+}
+
+void Stage::advance(double seconds) {
+    VirtualClock::advance(seconds);
+}
+
+bool Stage::settle(double seconds) {
+    int drawn = *_rendered;
+    int quiet = 0;
+    for (int left = static_cast<int>(seconds * 60); left > 0 && quiet < QUIET_FRAMES; --left) {
+        frames(1);
+        quiet = drawn == *_rendered ? quiet + 1 : 0;
+        drawn = *_rendered;
+    }
+    return quiet == QUIET_FRAMES;
+}
+
+void Stage::drawBezel() {
+    constexpr int samples = 4;
+    Evas_Object* const bezel = evas_object_image_filled_add(canvas());
+    evas_object_image_alpha_set(bezel, EINA_TRUE);
+    evas_object_image_size_set(bezel, SIZE, SIZE);
+    auto* pixels = static_cast<std::uint32_t*>(evas_object_image_data_get(bezel, EINA_TRUE));
+    for (int i = 0; i < SIZE * SIZE; ++i) {
+        const std::div_t place = std::div(i, SIZE);
+        std::uint32_t outside = 0;
+        for (int sample = 0; sample < samples * samples; ++sample) {
+            const std::div_t offset = std::div(sample, samples);
+            const double x = place.rem + (offset.rem + 0.5) / samples - SIZE / 2.0;
+            const double y = place.quot + (offset.quot + 0.5) / samples - SIZE / 2.0;
+            outside += std::hypot(x, y) > SIZE / 2.0 ? 1 : 0;
+        }
+        const std::uint32_t alpha = outside * 255 / (samples * samples);
+        const std::uint32_t grey = alpha * 40 / 255;
+        *pixels++ = alpha << 24 | grey << 16 | grey << 8 | grey;
+    }
+    evas_object_image_data_update_add(bezel, 0, 0, SIZE, SIZE);
+    evas_object_resize(bezel, SIZE, SIZE);
+    evas_object_layer_set(bezel, EVAS_LAYER_MAX);
+    evas_object_pass_events_set(bezel, EINA_TRUE);
+    evas_object_show(bezel);
+}
