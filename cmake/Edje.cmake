@@ -6,12 +6,14 @@ find_program(EDJE_CC edje_cc REQUIRED)
 function(edje_theme target root output)
     set(depfile "${CMAKE_CURRENT_BINARY_DIR}/${target}.d")
     cmake_path(GET output PARENT_PATH folder)
+    # The compiler's dependency file leaves out images.
+    file(GLOB images CONFIGURE_DEPENDS "${CMAKE_SOURCE_DIR}/host/theme/images/*.png")
     add_custom_command(
         OUTPUT "${output}"
         COMMAND "${CMAKE_COMMAND}" -E make_directory "${folder}"
         COMMAND "${CMAKE_SOURCE_DIR}/scripts/edje-compile" "${EDJE_CC}" "${root}" "${output}" "${depfile}"
-                -id "${CMAKE_SOURCE_DIR}/edje" -id "${CMAKE_SOURCE_DIR}/host/theme"
-        DEPENDS "${root}" "${CMAKE_SOURCE_DIR}/scripts/edje-compile"
+                -id "${CMAKE_SOURCE_DIR}/host/theme/images"
+        DEPENDS "${root}" ${images} "${CMAKE_SOURCE_DIR}/scripts/edje-compile"
         DEPFILE "${depfile}"
         COMMENT "Compiling theme ${target}"
         VERBATIM)

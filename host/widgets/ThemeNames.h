@@ -1,0 +1,38 @@
+/**
+ * @file
+ * @brief Names of the device theme's groups, parts, signals and data that the widgets use.
+ */
+#pragma once
+
+namespace host::theme {
+
+/** Class and group of every layout of the time picker: elm/layout/timepicker/STYLE. */
+inline constexpr const char* LAYOUT_CLASS = "layout";
+inline constexpr const char* PICKER_GROUP = "timepicker";
+
+inline constexpr const char* STYLE_12_HOURS = "time_layout";
+inline constexpr const char* STYLE_24_HOURS = "time_layout_24hr";
+inline constexpr const char* STYLE_WHEEL = "wheel";
+
+inline constexpr const char* PART_HOUR = "wheel.hour";
+inline constexpr const char* PART_MINUTE = "wheel.minute";
+inline constexpr const char* PART_HALF = "wheel.half";
+inline constexpr const char* PART_SEPARATOR = "separator";
+
+inline constexpr const char* SIGNAL_HALF_FIRST = "device,half,first";
+inline constexpr const char* SIGNAL_HALF_LAST = "device,half,last";
+inline constexpr const char* SIGNAL_SOURCE = "device";
+
+/** Where a wheel's values are drawn, and its measures in the theme's data. */
+inline constexpr const char* PART_VALUES = "values";
+inline constexpr const char* DATA_STEP = "step";
+inline constexpr const char* DATA_VALUE_HEIGHT = "value_height";
+
+/** Groups of one value, and their text. */
+inline constexpr const char* GROUP_NUMBER = "device/timepicker/number";
+inline constexpr const char* GROUP_WORD = "device/timepicker/word";
+inline constexpr const char* PART_VALUE = "value";
+/** A float: how far the value is from the middle, in values. */
+inline constexpr int MESSAGE_DISTANCE = 1;
+
+} // namespace host::theme

@@ -1,0 +1,121 @@
+#include "device/eext.h"
+
+#include <algorithm>
+#include <cstring>
+#include <vector>
+
+#include <Ecore.h>
+#include <Ecore_Evas.h>
+#include <Ecore_Input.h>
+#include <Elementary.h>
+
+#define LOG_TAG "device-host"
+#include "base/Log.h"
+
+// A desktop has no back key: XF86Back stands in for it, and Escape for keyboards without that one.
+// The release counts, so that a key held down goes back once.
+
+namespace {
+
+struct Listener {
+    Evas_Object* object;
+    eext_event_cb callback;
+    void* data;
+};
+
+/** In the order they were added. */
+std::vector<Listener>& listeners() {
+    static std::vector<Listener> all;
+    return all;
+}
+
+Ecore_Event_Handler*& keyHandler() {
+    static Ecore_Event_Handler* handler = nullptr;
+    return handler;
+}
+
+bool isBackKey(const char* name) {
+    return name && (std::strcmp(name, "XF86Back") == 0 || std::strcmp(name, "Escape") == 0);
+}
+
+/** Shown, and so is everything it is part of or clipped by. */
+bool isShown(const Evas_Object* object) {
+    for (const Evas_Object* o = object; o; o = evas_object_smart_parent_get(o)) {
+        if (!evas_object_visible_get(o))
+            return false;
+        for (const Evas_Object* clip = evas_object_clip_get(o); clip;
+             clip = evas_object_clip_get(clip))
+            if (!evas_object_visible_get(clip))
+                return false;
+    }
+    return true;
+}
+
+bool isInWindow(const Evas_Object* object, Ecore_Window window) {
+    Ecore_Evas* evas = ecore_evas_ecore_evas_get(evas_object_evas_get(object));
+    return evas && ecore_evas_window_get(evas) == window;
+}
+
+Eina_Bool keyReleased(void*, int, void* info) {
+    const auto* event = static_cast<Ecore_Event_Key*>(info);
+    if (!isBackKey(event->keyname))
+        return ECORE_CALLBACK_PASS_ON;
+    const auto& all = listeners();
+    const auto found = std::find_if(all.rbegin(), all.rend(), [event](const Listener& listener) {
+        return isInWindow(listener.object, event->event_window) && isShown(listener.object);
+    });
+    if (found == all.rend())
+        return ECORE_CALLBACK_PASS_ON;
+    // A copy: the callback may add and remove listeners.
+    const Listener listener = *found;
+    listener.callback(listener.data, listener.object, nullptr);
+    return ECORE_CALLBACK_PASS_ON;
+}
+
+void dropUnusedHandler() {
+    if (!listeners().empty() || !keyHandler())
+        return;
+    ecore_event_handler_del(keyHandler());
+    keyHandler() = nullptr;
+}
+
+void objectDeleted(void*, Evas*, Evas_Object* object, void*) {
+    std::erase_if(listeners(), [object](const Listener& l) { return l.object == object; });
+    dropUnusedHandler();
+}
+
+bool hasListener(Evas_Object* object) {
+    return std::any_of(listeners().begin(), listeners().end(),
+                       [object](const Listener& l) { return l.object == object; });
+}
+
+} // namespace
+
+void eext_object_event_callback_add(Evas_Object* obj, eext_event_type_e type,
+                                    eext_event_cb callback, void* data) {
+    if (!obj || !callback || type != EEXT_EVENT_BACK) {
+        LOG_ERROR("An object, the back key and a callback are needed");
+        return;
+    }
+    if (!hasListener(obj))
+        evas_object_event_callback_add(obj, EVAS_CALLBACK_DEL, objectDeleted, nullptr);
+    listeners().push_back({obj, callback, data});
+    if (!keyHandler())
+        keyHandler() = ecore_event_handler_add(ECORE_EVENT_KEY_UP, keyReleased, nullptr);
+}
+
+void* eext_object_event_callback_del(Evas_Object* obj, eext_event_type_e type,
+                                     eext_event_cb callback) {
+    auto& all = listeners();
+    const auto found = std::find_if(all.rbegin(), all.rend(), [=](const Listener& listener) {
+        return listener.object == obj && listener.callback == callback;
+    });
+    if (type != EEXT_EVENT_BACK || found == all.rend())
+        return nullptr;
+    void* data = found->data;
+    all.erase(std::next(found).base());
+    if (!hasListener(obj))
+        evas_object_event_callback_del_full(obj, EVAS_CALLBACK_DEL, objectDeleted, nullptr);
+    dropUnusedHandler();
+    return data;
+}

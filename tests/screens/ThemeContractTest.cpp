@@ -1,0 +1,176 @@
+#include <algorithm>
+#include <fstream>
+#include <iterator>
+#include <string>
+#include <vector>
+
+#include <Edje.h>
+#include <gtest/gtest.h>
+
+#include "../host/widgets/ThemeNames.h"
+#include "support/ScreenTest.h"
+
+namespace {
+
+using namespace host::theme;
+
+const std::string DEVICE = "device.edj";
+const std::string ROWS = "AlarmCustomTheme.edj";
+const std::string EDITOR = "AlarmEditViewController.edj";
+
+std::string pathOf(const std::string& file) {
+    return std::string(CLOCK_RESOURCE_DIR "/edje/") + file;
+}
+
+std::string pickerGroup(const std::string& style) {
+    return std::string("elm/") + LAYOUT_CLASS + "/" + PICKER_GROUP + "/" + style;
+}
+
+std::vector<std::string> groupsOf(const std::string& file) {
+    std::vector<std::string> names;
+    Eina_List* list = edje_file_collection_list(pathOf(file).c_str());
+    const Eina_List* node = nullptr;
+    void* name = nullptr;
+    EINA_LIST_FOREACH(list, node, name) {
+        names.emplace_back(static_cast<const char*>(name));
+    }
+    edje_file_collection_list_free(list);
+    return names;
+}
+
+/** What code asks of a theme: a group and the parts, signals aside, that it names. */
+struct Contract {
+    std::string file;
+    std::string group;
+    std::vector<std::string> parts;
+};
+
+const std::vector<Contract>& contracts() {
+    static const std::vector<std::string> popupParts = {"elm.text.title", "elm.swallow.content",
+                                                        "elm.swallow.action_area"};
+    static const std::vector<Contract> all = {
+        {ROWS, "elm/genlist/item/edit.theme.time/default", {"timepicker.area", "calendar.area"}},
+        {ROWS,
+         "elm/genlist/item_compress/edit.theme.time/default",
+         {"timepicker.area", "calendar.area"}},
+        {EDITOR, "edit.layout.calendar", {"date.text", "date.button"}},
+        {DEVICE,
+         "elm/naviframe/item/basic/default",
+         {"title_left_btn", "title_right_btn", "more_btn", "elm.text.title", "elm.swallow.prev_btn",
+          "elm.swallow.content"}},
+        {DEVICE, "elm/button/base/default", {"elm.text", "elm.swallow.content"}},
+        {DEVICE, "elm/button/base/naviframe/title_left", {"elm.text"}},
+        {DEVICE, "elm/button/base/naviframe/title_right", {"elm.text"}},
+        {DEVICE, "elm/button/base/naviframe/back_btn/default", {"elm.text", "arrow"}},
+        {DEVICE, "elm/button/base/on_gradient_bg", {"elm.text"}},
+        {DEVICE, "elm/button/base/popup", {"elm.text"}},
+        {DEVICE, "elm/popup/base/default", popupParts},
+        {DEVICE, "elm/popup/base/theme_bg", popupParts},
+        {DEVICE, "elm/popup/base/theme,bg", popupParts},
+        {DEVICE,
+         "elm/popup/buttons2/popup/default",
+         {"elm.swallow.content.button1", "elm.swallow.content.button2"}},
+        {DEVICE, "elm/check/base/on&off", {"track", "knob"}},
+        {DEVICE, "elm/entry/base-single/default", {"elm.text", "elm.guide"}},
+        {DEVICE, "elm/scroller/entry_single/default", {"elm.swallow.content", "line"}},
+        {DEVICE,
+         "elm/genlist/item_compress/entry.main/default",
+         {"elm.text.main", "elm.icon.entry"}},
+        {DEVICE,
+         "elm/genlist/item_compress/2line.top/default",
+         {"elm.text.main.left.top", "elm.text.sub.left.bottom"}},
+        {DEVICE, "elm/genlist/item/1line/default", {"elm.text.main.left", "elm.icon.2"}},
+        {DEVICE, "elm/genlist/item_compress/1icon/default", {"elm.icon"}},
+        {DEVICE,
+         "elm/genlist/item_compress/multiline_sub.main.1icon/default",
+         {"elm.text.main", "elm.text.multiline", "elm.icon"}},
+        {DEVICE, pickerGroup(STYLE_12_HOURS), {PART_HOUR, PART_MINUTE, PART_HALF, PART_SEPARATOR}},
+        {DEVICE, pickerGroup(STYLE_24_HOURS), {PART_HOUR, PART_MINUTE, PART_HALF, PART_SEPARATOR}},
+        {DEVICE, pickerGroup(STYLE_WHEEL), {PART_VALUES}},
+        {DEVICE, GROUP_NUMBER, {PART_VALUE}},
+        {DEVICE, GROUP_WORD, {PART_VALUE}},
+    };
+    return all;
+}
+
+class ThemeContractTest : public ScreenTest {
+protected:
+    Evas_Object* open(const std::string& file, const std::string& group) {
+        Evas_Object* edje = edje_object_add(stage().canvas());
+        const bool opened =
+            edje_object_file_set(edje, pathOf(file).c_str(), group.c_str()) != EINA_FALSE;
+        EXPECT_TRUE(opened) << file << ": " << group << ": "
+                            << edje_load_error_str(edje_object_load_error_get(edje));
+        return edje;
+    }
+};
+
+TEST_F(ThemeContractTest, EveryGroupAndPartThatCodeNamesExists) {
+    for (const Contract& contract : contracts()) {
+        Evas_Object* edje = open(contract.file, contract.group);
+        for (const std::string& part : contract.parts) {
+            EXPECT_TRUE(edje_object_part_exists(edje, part.c_str()))
+                << contract.group << " has no part " << part;
+        }
+        evas_object_del(edje);
+    }
+}
+
+TEST_F(ThemeContractTest, EveryGroupOfEveryThemeOpens) {
+    for (const std::string& file : {DEVICE, ROWS, EDITOR}) {
+        const auto groups = groupsOf(file);
+        EXPECT_FALSE(groups.empty()) << file;
+        for (const std::string& group : groups) {
+            evas_object_del(open(file, group));
+        }
+    }
+}
+
+TEST_F(ThemeContractTest, EveryRowStyleExistsForBothKindsOfLists) {
+    for (const std::string& file : {DEVICE, ROWS}) {
+        const auto groups = groupsOf(file);
+        for (const std::string& group : groups) {
+            const std::string plain = "elm/genlist/item/";
+            if (!group.starts_with(plain)) {
+                continue;
+            }
+            const std::string compressed =
+                "elm/genlist/item_compress/" + group.substr(plain.size());
+            EXPECT_NE(std::find(groups.begin(), groups.end(), compressed), groups.end())
+                << compressed;
+        }
+    }
+}
+
+TEST_F(ThemeContractTest, TheContractIsWrittenForEveryGroup) {
+    std::ifstream file(CLOCK_SOURCE_DIR "/docs/THEME.md");
+    const std::string text((std::istreambuf_iterator<char>(file)), {});
+    ASSERT_FALSE(text.empty());
+    for (const Contract& contract : contracts()) {
+        std::string group = contract.group;
+        if (const auto at = group.find("item_compress"); at != std::string::npos) {
+            group.replace(at, std::string("item_compress").size(), "item");
+        }
+        EXPECT_NE(text.find("`" + group + "`"), std::string::npos) << group;
+        for (const std::string& part : contract.parts) {
+            EXPECT_NE(text.find("`" + part + "`"), std::string::npos) << group << ": " << part;
+        }
+    }
+}
+
+TEST_F(ThemeContractTest, TheColoursThatCodeNamesAreInTheTheme) {
+    Evas_Object* edje = open(DEVICE, "elm/button/base/default");
+    for (const char* name : {"accent", "warning", "ground", "text", "B0211"}) {
+        int r = -1;
+        int g = -1;
+        int b = -1;
+        int a = 0;
+        EXPECT_TRUE(edje_object_color_class_get(edje, name, &r, &g, &b, &a, nullptr, nullptr,
+                                                nullptr, nullptr, nullptr, nullptr, nullptr,
+                                                nullptr))
+            << name;
+        EXPECT_EQ(a, 255) << name;
+    }
+}
+
+} // namespace
