@@ -1,0 +1,134 @@
+/**
+ * @file
+ * @brief The alarm editor.
+ */
+#pragma once
+
+#include <array>
+#include <cstddef>
+#include <ctime>
+#include <functional>
+#include <vector>
+
+#include <Elementary.h>
+
+#include <app_assist/WContentViewController.h>
+#include <app_assist/WUiTimer.h>
+#include <clock/ClockAlarmDbData.h>
+#include <clock/ClockEventListener.h>
+
+#include "AlarmEditViewCallerType.h"
+#include "ClockUiExport.h"
+
+class AlarmNameItem;
+class AlarmTimePickerItem;
+
+namespace app_assist {
+class WGenlistItem;
+}
+
+namespace rules {
+enum class EditorRow : int;
+}
+
+/**
+ * @brief The page on which an alarm is created or edited.
+ *
+ * One working copy of the alarm is shared by reference with every row; a row writes what the user
+ * does into it at once. Done stores it, schedules it and leaves. Leaving otherwise asks first when
+ * the copy differs from what it was at the start.
+ */
+class CLOCK_UI_EXPORT AlarmEditViewController : public app_assist::WContentViewController,
+                                                public ClockEventListener {
+public:
+    /**
+     * @param callerType Decides how the page is left.
+     * @param alarm The alarm to edit, or a record with defaults; copied.
+     * @param isCreate True for a new alarm, which gets the defaults of new alarms.
+     */
+    AlarmEditViewController(AlarmEditViewCallerType callerType, const ClockAlarmDbData& alarm,
+                            bool isCreate);
+    ~AlarmEditViewController() override;
+
+    const char* getClassName() const override;
+    /** @brief Adds Cancel and Done and the title. */
+    void onPushed(Elm_Object_Item* naviItem) override;
+    /** @brief Lets the page go, or asks, or ends the application; see #AlarmEditViewCallerType. */
+    bool onPop() override;
+    void onEvent(ClockEventListener::EventType type) override;
+
+    /** @brief Brings the rows in line with a newly chosen alert type. */
+    void _onTypePopupViewSelectedCb();
+
+    /** @name Steps of Done and the minute timer's callback; data is the editor.
+     *  @{ */
+    static void _saveAlarmName(void* data);
+    static void _saveAlarmTime(void* data);
+    static void _saveAlarmData(void* data);
+    static void _registerAlarmData(void* data);
+    static void _createNotiToastForTimeOffest(void* data);
+    static void _createNotiToastForDuplicatedAlarm(void* data);
+    static bool _updateDateTextTimerCb(void* data);
+    /** @} */
+
+protected:
+    Evas_Object* onCreateView(Evas_Object* parent, void* param) override;
+
+private:
+    static constexpr std::size_t ROW_COUNT = 8;
+
+    static void _cancelBtnClickedCb(void* data, Evas_Object* button, void* info);
+    static void _doneBtnClickedCb(void* data, Evas_Object* button, void* info);
+    static void _genlistDeletedCb(void* data, Evas* evas, Evas_Object* genlist, void* info);
+
+    Evas_Object* addTitleButton(Elm_Object_Item* naviItem, const char* style, const char* part,
+                                const char* textId, Evas_Smart_Cb clicked);
+    void setTitle();
+    void addThemeExtension();
+
+    // Rows.
+    void _createEditViewItems(Evas_Object* genlist);
+    app_assist::WGenlistItem* makeRow(rules::EditorRow row);
+    app_assist::WGenlistItem* makeTimePickerRow();
+    void insertRow(rules::EditorRow row);
+    void removeRow(rules::EditorRow row);
+    void refreshRow(rules::EditorRow row);
+    app_assist::WGenlistItem* rowAt(rules::EditorRow row) const;
+    AlarmTimePickerItem* timePickerRow() const;
+    AlarmNameItem* nameRow() const;
+    void logMissingSoundRows() const;
+
+    // Date line.
+    void _updateDateText();
+    void armMinuteTimer();
+
+    // Saving.
+    void _initialzeAlarmData();
+    void storeAlarm();
+    void storeOverDuplicate(int duplicateId);
+    void replaceOtherAlarm(int otherId, int otherAlarmMgrId);
+    void updateStoredAlarm();
+    int alarmMgrIdOf(int alarmId);
+
+    // Leaving.
+    bool leaveInsideClock();
+    bool leaveApplication();
+    bool mayLeave() const;
+    void askToDiscard(const std::function<void()>& discard);
+
+    /** By place; null while a row is absent. The genlist owns the rows. */
+    std::array<app_assist::WGenlistItem*, ROW_COUNT> _rows{};
+    app_assist::WWeakPtr<app_assist::WViewController> _discardPopup;
+    AlarmEditViewCallerType _callerType;
+    ClockAlarmDbData _alarm;
+    ClockAlarmDbData _snapshot;
+    std::vector<ClockAlarmDbData> _alarmList;
+    bool _isCreate;
+    bool _doneClicked = false;
+    bool _resourcesOpen = false;
+    Evas_Object* _genlist = nullptr;
+    Evas_Object* _cancelButton = nullptr;
+    /** The day in the date line. */
+    std::tm _date{};
+    app_assist::WWeakPtr<app_assist::WUiTimer> _minuteTimer;
+};

@@ -1,0 +1,3 @@
+#include "AlarmEditModel.h"
+
+AlarmEditModel::~AlarmEditModel() = default;

@@ -1,0 +1,40 @@
+// The editor's date line and the timer that keeps it current.
+#define LOG_TAG "alarm-ui-common"
+#include "AlarmEditViewController.h"
+
+#include <clock/ClockText.h>
+
+#include "AlarmTimePickerItem.h"
+#include "NullData.h"
+#include "rules/DateLine.h"
+#include "rules/RingDay.h"
+#include "rules/WeekdaySet.h"
+
+void AlarmEditViewController::_updateDateText() {
+    constexpr std::size_t MAX_LINE_BYTES = 1023;
+    std::string text = rules::weekdaySummary(_alarm.repeatWeekly);
+    if (text.empty()) {
+        const rules::RingDay ring = rules::ringDay(_alarm.hour, _alarm.min, std::time(nullptr));
+        const char* word = ring.today ? "IDS_CLOCK_BODY_TODAY" : "IDS_CLOCK_BODY_TOMORROW";
+        text = rules::wordAndDate(clockText(word), rules::dateText(ring.midnight), MAX_LINE_BYTES);
+        _date = ring.day;
+    }
+    const AlarmTimePickerItem* row = timePickerRow();
+    if (Evas_Object* calendar = row ? row->getCalendarObj() : nullptr)
+        elm_object_part_text_set(calendar, "date.text", text.c_str());
+}
+
+void AlarmEditViewController::armMinuteTimer() {
+    app_assist::WUiTimer::destroy(_minuteTimer);
+    _minuteTimer = app_assist::WUiTimer::addTimer(rules::secondsToNextMinute(std::time(nullptr)),
+                                                  _updateDateTextTimerCb, this);
+}
+
+bool AlarmEditViewController::_updateDateTextTimerCb(void* data) {
+    RETURN_IF_NULL(data, false);
+    auto* self = static_cast<AlarmEditViewController*>(data);
+    if (AlarmTimePickerItem* row = self->timePickerRow())
+        row->updateDateText();
+    self->armMinuteTimer();
+    return false;
+}

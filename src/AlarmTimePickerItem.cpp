@@ -1,0 +1,258 @@
+#define LOG_TAG "alarm-ui-common"
+#include "AlarmTimePickerItem.h"
+
+#include <cstdlib>
+#include <memory>
+#include <string_view>
+#include <unordered_set>
+
+#include <Elementary.h>
+
+#include <base/Text.h>
+#include <clock/ClockStringUtil.h>
+#include <clock/ClockText.h>
+#include <device/ea.h>
+#include <device/uxt.h>
+
+#include "NullData.h"
+#include "ThemePath.h"
+#include "rules/DateLine.h"
+#include "rules/RingDay.h"
+#include "rules/WeekdaySet.h"
+
+namespace {
+
+constexpr const char* REGION_KEY = "db/menu_widget/regionformat";
+constexpr const char* HOURS_KEY = "db/menu_widget/regionformat_time1224";
+constexpr int TWELVE_HOURS = 1;
+constexpr int TWENTY_FOUR_HOURS = 2;
+
+constexpr const char* STYLE_12 = "time_layout";
+constexpr const char* STYLE_24 = "time_layout_24hr";
+
+using Text = std::unique_ptr<char, decltype(&std::free)>;
+
+Text regionLocale() {
+    return Text(vconf_get_str(REGION_KEY), &std::free);
+}
+
+// Settings callbacks are never taken back, so they also arrive for pickers that are gone.
+std::unordered_set<const Evas_Object*>& livePickers() {
+    static std::unordered_set<const Evas_Object*> pickers;
+    return pickers;
+}
+
+void pickerDeletedCb(void*, Evas*, Evas_Object* picker, void*) {
+    livePickers().erase(picker);
+}
+
+std::string dateButtonLabel() {
+    constexpr std::size_t MAX_LABEL_BYTES = 255;
+    const auto label = base::cutUtf8(clockText("IDS_COM_BODY_DATE"), MAX_LABEL_BYTES);
+    return ClockStringUtil::changeStringToUpper(std::string(label));
+}
+
+void setDateText(Evas_Object* calendar, const std::string& text) {
+    elm_object_part_text_set(calendar, "date.text", text.c_str());
+}
+
+std::string dateTextOf(const Evas_Object* calendar) {
+    const char* text = elm_object_part_text_get(calendar, "date.text");
+    return text ? text : "";
+}
+
+} // namespace
+
+AlarmTimePickerItem::AlarmTimePickerItem(ClockAlarmDbData& alarm, std::tm& date)
+    : _alarm(alarm), _date(date) {}
+
+AlarmTimePickerItem::~AlarmTimePickerItem() {
+    // The list may delete the row before the widgets.
+    for (Evas_Object* picker : _datetimes.all())
+        evas_object_smart_callback_del_full(picker, "changed", _datetimeChangedCb, this);
+    for (Evas_Object* button : _dateButtons.all())
+        evas_object_smart_callback_del_full(button, "clicked", _dateBtnClickedCb, this);
+    for (Evas_Object* calendar : _calendars.all())
+        evas_object_event_callback_del_full(calendar, EVAS_CALLBACK_DEL, _calendarDeletedCb, this);
+}
+
+Elm_Genlist_Item_Class* AlarmTimePickerItem::getItemClassNew() {
+    Elm_Genlist_Item_Class* itemClass = elm_genlist_item_class_new();
+    itemClass->item_style = "edit.theme.time";
+    itemClass->decorate_item_style = "mode/slide";
+    itemClass->func.content_get = _getTimePickerItemContent;
+    itemClass->func.del = deleteCb;
+    return itemClass;
+}
+
+void AlarmTimePickerItem::setDateBtnSelectedCb(const std::function<void()>& selected) {
+    _dateBtnSelected = selected;
+}
+
+void AlarmTimePickerItem::updateDateText() {
+    if (_alarm.autoDate != 0)
+        _datetimeChangedCb(this, getDateTimeObj(), nullptr);
+    if (Evas_Object* button = _dateButtons.newest())
+        elm_object_text_set(button, dateButtonLabel().c_str());
+}
+
+Evas_Object* AlarmTimePickerItem::_getTimePickerItemContent(void* data, Evas_Object* genlist,
+                                                            const char* part) {
+    RETURN_IF_NULL(data, nullptr);
+    auto* self = static_cast<AlarmTimePickerItem*>(data);
+    const std::string_view name(part ? part : "");
+    if (name == "timepicker.area")
+        return self->createTimePicker(genlist);
+    if (name == "calendar.area")
+        return self->createCalendar(genlist);
+    return nullptr;
+}
+
+Evas_Object* AlarmTimePickerItem::createTimePicker(Evas_Object* genlist) {
+    const Text locale = regionLocale();
+    int hours = 0;
+    vconf_get_int(HOURS_KEY, &hours);
+    const bool twelve = hours == TWELVE_HOURS;
+    Evas_Object* picker = uxt_date_time_add(genlist, twelve ? STYLE_12 : STYLE_24);
+    if (!picker) {
+        LOG_ERROR("datetime is NULL !!");
+        return nullptr;
+    }
+    uxt_date_time_set_format_by_locale(picker, locale.get(), twelve ? 0 : 1);
+    _datetimes.add(picker);
+    livePickers().insert(picker);
+    evas_object_event_callback_add(picker, EVAS_CALLBACK_DEL, pickerDeletedCb, nullptr);
+
+    ea_theme_object_color_replace(picker, "B0211", "transparent");
+    std::tm shown = rules::localTime(std::time(nullptr));
+    shown.tm_hour = _alarm.hour;
+    shown.tm_min = _alarm.min;
+    elm_datetime_value_set(picker, &shown);
+
+    evas_object_smart_callback_add(picker, "changed", _datetimeChangedCb, this);
+    vconf_notify_key_changed(REGION_KEY, _datetimeFormatChangedCb, picker);
+    vconf_notify_key_changed(HOURS_KEY, _datetimeFormatChangedCb, picker);
+    return picker;
+}
+
+Evas_Object* AlarmTimePickerItem::createCalendar(Evas_Object* genlist) {
+    const std::string path = themePath("edje/AlarmEditViewController.edj");
+    Evas_Object* calendar = elm_layout_add(genlist);
+    elm_layout_file_set(calendar, path.c_str(), "edit.layout.calendar");
+    showDate(calendar);
+    _calendars.add(calendar);
+    evas_object_event_callback_add(calendar, EVAS_CALLBACK_DEL, _calendarDeletedCb, this);
+    if (Evas_Object* button = createDateButton(calendar))
+        elm_object_part_content_set(calendar, "date.button", button);
+    return calendar;
+}
+
+Evas_Object* AlarmTimePickerItem::createDateButton(Evas_Object* calendar) {
+    Evas_Object* button = uxt_button_add(calendar, "on_gradient_bg");
+    if (!button)
+        return nullptr;
+    elm_object_text_set(button, dateButtonLabel().c_str());
+    evas_object_smart_callback_add(button, "clicked", _dateBtnClickedCb, this);
+    _dateButtons.add(button);
+    return button;
+}
+
+void AlarmTimePickerItem::showDate(Evas_Object* calendar) {
+    if (_alarm.autoDate != 0)
+        setDateText(calendar, ringDateText());
+    else if (_alarm.repeatWeekly != 0)
+        setDateText(calendar, rules::weekdaySummary(_alarm.repeatWeekly));
+    else if (const Evas_Object* before = _calendars.newest())
+        setDateText(calendar, dateTextOf(before));
+    else if (!_lastDateText.empty())
+        setDateText(calendar, _lastDateText);
+}
+
+void AlarmTimePickerItem::_calendarDeletedCb(void* data, Evas*, Evas_Object* calendar, void*) {
+    static_cast<AlarmTimePickerItem*>(data)->_lastDateText = dateTextOf(calendar);
+}
+
+std::string AlarmTimePickerItem::ringDateText() {
+    _date = rules::localTime(_alarm.autoDate);
+    const std::tm now = rules::localTime(std::time(nullptr));
+    switch (rules::dateLine(_date, _alarm.hour, _alarm.min, now)) {
+    case rules::DateLine::TodayAndDate:
+        return rules::wordAndDate(clockText("IDS_CLOCK_BODY_TODAY"),
+                                  rules::dateText(_alarm.autoDate));
+    case rules::DateLine::TomorrowAndDate:
+        return rules::wordAndDate(clockText("IDS_CLOCK_BODY_TOMORROW"),
+                                  rules::dateText(_alarm.autoDate));
+    case rules::DateLine::Date:
+        return rules::dateText(_alarm.autoDate);
+    case rules::DateLine::DateWithYear:
+        return rules::dateText(_alarm.autoDate, rules::DAY_AND_YEAR_SKELETON);
+    case rules::DateLine::Past:
+        break;
+    }
+    return repairedDateText();
+}
+
+std::string AlarmTimePickerItem::repairedDateText() {
+    LOG_ERROR("Set autoDate and manualDate to 0. Time already passed !!");
+    // autoDate stays 0 on purpose: the next turn of a wheel, or saving, fills it in.
+    rules::clearPastDate(_alarm);
+    std::tm tomorrow = rules::oneDayLater(std::time(nullptr));
+    _date = tomorrow;
+    const std::time_t midnight = rules::toMidnight(tomorrow);
+    return rules::wordAndDate(clockText("IDS_CLOCK_BODY_TOMORROW"), rules::dateText(midnight));
+}
+
+void AlarmTimePickerItem::_datetimeChangedCb(void* data, Evas_Object* datetime, void*) {
+    RETURN_IF_NULL(data);
+    auto* self = static_cast<AlarmTimePickerItem*>(data);
+    ClockAlarmDbData& alarm = self->_alarm;
+    std::tm picked{};
+    // Without wheels the record holds the time that they showed last.
+    if (datetime && elm_datetime_value_get(datetime, &picked)) {
+        alarm.hour = picked.tm_hour;
+        alarm.min = picked.tm_min;
+    }
+    if (alarm.repeatWeekly != 0 || alarm.manualDate != 0)
+        return;
+    const rules::RingDay ring = rules::ringDay(alarm.hour, alarm.min, std::time(nullptr));
+    alarm.autoDate = static_cast<std::int32_t>(ring.midnight);
+    self->_date = ring.day;
+    const char* word = ring.today ? "IDS_CLOCK_BODY_TODAY" : "IDS_CLOCK_BODY_TOMORROW";
+    if (Evas_Object* calendar = self->getCalendarObj())
+        setDateText(calendar, rules::wordAndDate(clockText(word), rules::dateText(ring.midnight)));
+}
+
+void AlarmTimePickerItem::_dateBtnClickedCb(void* data, Evas_Object*, void*) {
+    RETURN_IF_NULL(data);
+    static_cast<AlarmTimePickerItem*>(data)->_dateBtnSelected();
+}
+
+void AlarmTimePickerItem::_datetimePickerRegionFormatSet(Evas_Object* datetime) {
+    if (!datetime) {
+        LOG_ERROR("datetime is NULL !!");
+        return;
+    }
+    const Text locale = regionLocale();
+    int hours = 0;
+    const bool readable = vconf_get_int(HOURS_KEY, &hours) == VCONF_OK;
+    if (!locale || !readable) {
+        elm_object_style_set(datetime, STYLE_12);
+        elm_datetime_format_set(datetime, "%d/%b/%Y %I:%M %p");
+    } else if (hours == TWELVE_HOURS) {
+        elm_object_style_set(datetime, STYLE_12);
+        uxt_date_time_set_format_by_locale(datetime, locale.get(), 0);
+    } else if (hours == TWENTY_FOUR_HOURS) {
+        elm_object_style_set(datetime, STYLE_24);
+        uxt_date_time_set_format_by_locale(datetime, locale.get(), 1);
+    }
+}
+
+void AlarmTimePickerItem::_datetimeFormatChangedCb(keynode_t*, void* data) {
+    RETURN_IF_NULL(data);
+    auto* picker = static_cast<Evas_Object*>(data);
+    if (!livePickers().contains(picker)) {
+        LOG_INFO("The time picker is gone. Ignore callback");
+        return;
+    }
+    _datetimePickerRegionFormatSet(picker);
+}

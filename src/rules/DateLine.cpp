@@ -1,0 +1,51 @@
+#include "rules/DateLine.h"
+
+#include <array>
+#include <cstdlib>
+#include <memory>
+
+#include <base/Text.h>
+#include <clock/ClockIcuDataModel.h>
+
+#include "rules/RingDay.h"
+
+namespace rules {
+
+DateLine dateLine(const std::tm& ringDay, int hour, int minute, const std::tm& now) {
+    if (ringDay.tm_year != now.tm_year)
+        return ringDay.tm_year > now.tm_year ? DateLine::DateWithYear : DateLine::Past;
+    if (ringDay.tm_mon != now.tm_mon)
+        return ringDay.tm_mon > now.tm_mon ? DateLine::Date : DateLine::Past;
+    const int days = ringDay.tm_mday - now.tm_mday;
+    if (days < 0)
+        return DateLine::Past;
+    if (days > 0)
+        return days == 1 ? DateLine::TomorrowAndDate : DateLine::Date;
+    return isStillToCome(hour, minute, now) ? DateLine::TodayAndDate : DateLine::Past;
+}
+
+void clearPastDate(ClockAlarmDbData& alarm) {
+    alarm.repeatOnce = 1;
+    alarm.autoDate = 0;
+    alarm.manualDate = 0;
+    alarm.repeatWeekly = 0;
+}
+
+std::string currentTimeZone() {
+    const std::unique_ptr<char, decltype(&std::free)> zone(ClockIcuDataModel::getCurrentTimeZone(),
+                                                           &std::free);
+    return zone ? zone.get() : "";
+}
+
+std::string dateText(std::time_t day, const char* skeleton) {
+    std::array<char, 512> buffer{};
+    ClockIcuDataModel::getFormattedDateString(day, buffer.data(), static_cast<int>(buffer.size()),
+                                              nullptr, skeleton, currentTimeZone().c_str());
+    return buffer.data();
+}
+
+std::string wordAndDate(const std::string& word, const std::string& date, std::size_t maxBytes) {
+    return std::string(base::cutUtf8(word + " - " + date, maxBytes));
+}
+
+} // namespace rules
