@@ -26,13 +26,13 @@ typedef struct {
  * @brief Prepares the folders and the language; before the toolkit is initialised.
  *
  * Creates missing folders, checks that they can be written, sets the locale from the environment
- * with English as the language of last resort, and binds the text domain "clock" as the default one.
+ * with English as the language of last resort, and binds the text domain "clock" as the default
+ * one.
  * @param config May be null.
  * @param[out] error Gets one sentence about what is unusable and why; may be null.
  * @return 0, or a negative number.
  */
-DEVICE_API int device_host_init(const device_host_config_s* config, char* error,
-                                size_t error_size);
+DEVICE_API int device_host_init(const device_host_config_s* config, char* error, size_t error_size);
 
 /**
  * @brief Gives the toolkit the device's look and feel; after elm_init(), before the first window.

@@ -1,0 +1,43 @@
+/**
+ * @file
+ * @brief Tells on the main loop which files of some folders have changed, whoever changed them.
+ */
+#pragma once
+
+#include <functional>
+#include <map>
+#include <memory>
+#include <string>
+#include <vector>
+
+#include <Ecore.h>
+
+namespace host {
+
+/** Watches folders with inotify. It may be destroyed from inside its callback. */
+class FolderWatch {
+public:
+    /** Receives the name of a changed file, or an empty name when any file may have changed. */
+    using Changed = std::function<void(const std::string& fileName)>;
+
+    explicit FolderWatch(Changed changed);
+    ~FolderWatch();
+    FolderWatch(const FolderWatch&) = delete;
+    FolderWatch& operator=(const FolderWatch&) = delete;
+
+    /** Watches a folder, which is created when it is missing. @return 0 or an errno. */
+    int add(const std::string& folder);
+
+private:
+    static Eina_Bool _readableCb(void* data, Ecore_Fd_Handler* handler);
+    std::vector<std::string> readChanges();
+    void watchAgain(int watch);
+
+    Changed _changed;
+    int _inotify = -1;
+    Ecore_Fd_Handler* _handler = nullptr;
+    std::map<int, std::string> _folders;
+    std::shared_ptr<bool> _alive = std::make_shared<bool>(true);
+};
+
+} // namespace host
