@@ -1,0 +1,158 @@
+# shellcheck shell=bash
+# Sourced by the tour and the journeys: a virtual display, the simulator on it, and a finger.
+#
+# Every place that is tapped stands here, in pixels of the 360 x 360 face.
+
+WATCH_CREATE="180 325"      # button of the alarm list
+WATCH_FIRST_ALARM="180 165" # first row of the alarm list
+WATCH_CANCEL="124 60"       # title buttons of the editor
+WATCH_DONE="236 60"
+WATCH_HOUR_X=122            # wheels of the editor
+WATCH_MINUTE_X=238
+WATCH_WHEEL_TOP=100
+WATCH_WHEEL_BOTTOM=225
+WATCH_WHEEL_STEP=54         # height of one value
+WATCH_WHEEL_FEW=3           # so many values can be turned without leaving the display
+WATCH_SCROLL_FROM="60 285"  # scrolls the editor to its end
+WATCH_SCROLL_TO="60 90"
+WATCH_NAME="160 262"        # name field, once the list is scrolled to its end
+WATCH_KEEP="115 276"        # buttons of the discard popup
+WATCH_DISCARD="245 276"
+
+watch_pids=()
+
+# watch_wait SECONDS COMMAND...: tries until the command succeeds.
+watch_wait() {
+    local tries=$(($1 * 20))
+    shift
+    until "$@" >/dev/null 2>&1; do
+        tries=$((tries - 1))
+        [ $tries -gt 0 ] || return 1
+        sleep 0.05
+    done
+}
+
+# watch_display DIRECTORY: starts a display of its own and a window manager on it.
+watch_display() {
+    local number=$1/display-number
+    Xvfb -displayfd 3 -screen 0 360x360x24 -nolisten tcp 3>"$number" 2>"$1/xvfb.log" &
+    watch_pids+=($!)
+    watch_wait 20 test -s "$number" || return 1
+    DISPLAY=:$(cat "$number")
+    export DISPLAY
+    matchbox-window-manager -use_titlebar no >"$1/window-manager.log" 2>&1 &
+    watch_pids+=($!)
+    watch_wait 20 xdotool getmouselocation
+}
+
+# watch_start LOG PROGRAM [ARGUMENT...]: starts the simulator and waits until its window is there.
+watch_start() {
+    local log=$1
+    shift
+    "$@" >>"$log" 2>&1 &
+    watch_pid=$!
+    watch_pids+=("$watch_pid")
+    watch_wait 30 watch_window_or_end || return 1
+    kill -0 "$watch_pid" 2>/dev/null && watch_settled
+}
+
+watch_window_or_end() {
+    xdotool search --onlyvisible --name '^clock-sim$' || ! kill -0 "$watch_pid"
+}
+
+# watch_stop: ends the simulator as a session's end does. Returns its exit status.
+watch_stop() {
+    kill -TERM "$watch_pid" 2>/dev/null
+    wait "$watch_pid"
+}
+
+# watch_end: ends everything that was started here.
+watch_end() {
+    local index
+    for ((index = ${#watch_pids[@]} - 1; index >= 0; index--)); do
+        kill "${watch_pids[index]}" 2>/dev/null
+        wait "${watch_pids[index]}" 2>/dev/null
+    done
+    watch_pids=()
+}
+
+# Prints a fingerprint of what is on the face.
+watch_look() {
+    import -window root rgb:- | cksum
+}
+
+# watch_settled: waits until the face has stopped moving.
+watch_settled() {
+    local before now tries=100
+    before=$(watch_look)
+    while [ $tries -gt 0 ]; do
+        sleep 0.15
+        now=$(watch_look)
+        [ "$now" = "$before" ] && return 0
+        before=$now
+        tries=$((tries - 1))
+    done
+    return 1
+}
+
+# watch_picture FILE: saves what is on the face.
+watch_picture() {
+    import -window root "png:$1"
+}
+
+# watch_tap X Y
+watch_tap() {
+    xdotool mousemove "$1" "$2" mousedown 1 sleep 0.05 mouseup 1
+    watch_settled
+}
+
+# watch_drag X1 Y1 X2 Y2: a slow drag that rests before the finger is lifted, so nothing is flung.
+watch_drag() {
+    local step steps=12
+    xdotool mousemove "$1" "$2" mousedown 1
+    for ((step = 1; step <= steps; step++)); do
+        xdotool mousemove $(($1 + ($3 - $1) * step / steps)) $(($2 + ($4 - $2) * step / steps)) sleep 0.02
+    done
+    xdotool sleep 0.3 mouseup 1
+    watch_settled
+}
+
+# watch_turn X STEPS: turns the wheel at X by STEPS values, later ones for positive numbers.
+watch_turn() {
+    local left=$2 few
+    while [ "$left" != 0 ]; do
+        few=$left
+        [ "$few" -le $WATCH_WHEEL_FEW ] || few=$WATCH_WHEEL_FEW
+        [ "$few" -ge -$WATCH_WHEEL_FEW ] || few=-$WATCH_WHEEL_FEW
+        if [ "$few" -gt 0 ]; then
+            watch_drag "$1" $WATCH_WHEEL_BOTTOM "$1" $((WATCH_WHEEL_BOTTOM - few * WATCH_WHEEL_STEP)) || return 1
+        else
+            watch_drag "$1" $WATCH_WHEEL_TOP "$1" $((WATCH_WHEEL_TOP - few * WATCH_WHEEL_STEP)) || return 1
+        fi
+        left=$((left - few))
+    done
+}
+
+# watch_set_time FROM TO: turns both wheels, for example from 06:00 to 07:30.
+watch_set_time() {
+    watch_turn $WATCH_HOUR_X $((10#${2%:*} - 10#${1%:*})) &&
+        watch_turn $WATCH_MINUTE_X $((10#${2#*:} - 10#${1#*:}))
+}
+
+# Scrolls the editor to its name field.
+watch_show_name() {
+    # shellcheck disable=SC2086
+    watch_drag $WATCH_SCROLL_FROM $WATCH_SCROLL_TO
+}
+
+# watch_key KEY...
+watch_key() {
+    xdotool key "$@"
+    watch_settled
+}
+
+# watch_type TEXT
+watch_type() {
+    xdotool type --delay 30 "$1"
+    watch_settled
+}

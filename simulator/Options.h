@@ -1,0 +1,32 @@
+/**
+ * @file
+ * @brief The simulator's command line.
+ */
+#pragma once
+
+#include <optional>
+#include <string>
+#include <vector>
+
+namespace simulator {
+
+/** What the command line asks for. Empty texts mean the device's defaults. */
+struct Options {
+    bool help = false;
+    bool version = false;
+    bool create = false;            ///< Open the editor for a new alarm at once.
+    std::optional<int> editId;      ///< Open the editor on a stored alarm at once.
+    std::optional<bool> twelveHour; ///< Set the device to 12 or to 24 hours.
+    std::string dataDir;
+    std::string resourceDir;
+    std::string language;
+    std::string error; ///< Why the command line makes no sense; empty when it does.
+};
+
+/** @brief Reads a command line. @param arguments Without the program's name. */
+Options parseOptions(const std::vector<std::string>& arguments);
+
+/** @brief The text of --help. */
+std::string helpText();
+
+} // namespace simulator

@@ -1,0 +1,74 @@
+#include "ToastView.h"
+
+#include <cstdlib>
+
+#include <Elementary.h>
+
+#include "WatchFace.h"
+#include "device_host.h"
+
+#define LOG_TAG "clock-sim"
+#include "base/Log.h"
+
+namespace simulator {
+
+namespace {
+constexpr double TOAST_SECONDS = 3.0;
+}
+
+ToastView::ToastView(Evas_Object* window, const std::string& theme)
+    : _layout(elm_layout_add(window)) {
+    if (!elm_layout_file_set(_layout, theme.c_str(), "simulator/toast"))
+        LOG_ERROR("'%s' has no toast", theme.c_str());
+    evas_object_resize(_layout, FACE_SIZE, FACE_SIZE);
+    // Right below the bezel.
+    evas_object_layer_set(_layout, EVAS_LAYER_MAX - 1);
+    evas_object_show(_layout);
+    device_host_set_toast_callback(_toastCb, this);
+}
+
+ToastView::~ToastView() {
+    device_host_set_toast_callback(nullptr, nullptr);
+    evas_object_del(_layout);
+}
+
+void ToastView::_toastCb(const char* message, void* data) {
+    auto* self = static_cast<ToastView*>(data);
+    if (self == nullptr || message == nullptr) {
+        LOG_ERROR("Data is NULL !!");
+        return;
+    }
+    self->post(message);
+}
+
+void ToastView::post(const std::string& text) {
+    _waiting.push_back(text);
+    if (!_timer)
+        showNext();
+}
+
+void ToastView::showNext() {
+    char* markup = elm_entry_utf8_to_markup(_waiting.front().c_str());
+    elm_object_part_text_set(_layout, "toast.text", markup);
+    std::free(markup);
+    _waiting.pop_front();
+    elm_object_signal_emit(_layout, "toast,show", "simulator");
+    _timer.reset(ecore_timer_add(TOAST_SECONDS, _timeOverCb, this));
+}
+
+Eina_Bool ToastView::_timeOverCb(void* data) {
+    auto* self = static_cast<ToastView*>(data);
+    if (self == nullptr) {
+        LOG_ERROR("Data is NULL !!");
+        return ECORE_CALLBACK_CANCEL;
+    }
+    // The main loop deletes the timer of a callback that cancels.
+    static_cast<void>(self->_timer.release());
+    if (self->_waiting.empty())
+        elm_object_signal_emit(self->_layout, "toast,hide", "simulator");
+    else
+        self->showNext();
+    return ECORE_CALLBACK_CANCEL;
+}
+
+} // namespace simulator

@@ -1,0 +1,45 @@
+/**
+ * @file
+ * @brief Toasts on the face.
+ */
+#pragma once
+
+#include <deque>
+#include <memory>
+#include <string>
+
+#include <Ecore.h>
+#include <Evas.h>
+
+namespace simulator {
+
+/**
+ * @brief Shows the device's toasts, one after the other, over everything else in a window.
+ *
+ * Toasts let input through. One object per process; it must go before its window.
+ */
+class ToastView {
+public:
+    /** @param window Owner of what is drawn. @param theme Path of the simulator's theme. */
+    ToastView(Evas_Object* window, const std::string& theme);
+    ~ToastView();
+    ToastView(const ToastView&) = delete;
+    ToastView& operator=(const ToastView&) = delete;
+
+    /** @brief Shows a text, or keeps it until the texts before it have been shown. */
+    void post(const std::string& text);
+
+private:
+    struct TimerDeleter {
+        void operator()(Ecore_Timer* timer) const { ecore_timer_del(timer); }
+    };
+    static void _toastCb(const char* message, void* data);
+    static Eina_Bool _timeOverCb(void* data);
+    void showNext();
+
+    Evas_Object* _layout;
+    std::deque<std::string> _waiting;
+    std::unique_ptr<Ecore_Timer, TimerDeleter> _timer;
+};
+
+} // namespace simulator

@@ -1,0 +1,176 @@
+#include "Watch.h"
+
+#include <algorithm>
+#include <array>
+#include <cstdio>
+#include <cstdlib>
+#include <memory>
+#include <vector>
+
+#include <Ecore_X.h>
+#include <Efreet.h>
+#include <Elementary.h>
+
+#include "AlarmListViewController.h"
+#include "Keys.h"
+#include "ToastView.h"
+#include "WatchFace.h"
+#include "app_assist/WNaviframeController.h"
+#include "app_assist/WWindowController.h"
+#include "clock/ClockAlarmDbModel.h"
+#include "clock/ClockAlarmManagerModel.h"
+#include "clock/ClockEventListener.h"
+#include "device/app_resource_manager.h"
+#include "device/vconf.h"
+#include "device_host.h"
+
+namespace simulator {
+namespace {
+
+constexpr const char* TIME_FORM_KEY = "db/menu_widget/regionformat_time1224";
+constexpr int TWELVE_HOURS = 1;
+constexpr int TWENTY_FOUR_HOURS = 2;
+
+int fail(const std::string& reason) {
+    std::fprintf(stderr, "clock-sim: %s\n", reason.c_str());
+    return EXIT_FAILURE;
+}
+
+const char* orNull(const std::string& text) {
+    return text.empty() ? nullptr : text.c_str();
+}
+
+/** The device and the toolkit, ended in the order that they need. */
+class Device {
+public:
+    Device() = default;
+    ~Device() {
+        if (_started)
+            device_host_shutdown();
+        if (_toolkitUp)
+            elm_shutdown();
+    }
+    Device(const Device&) = delete;
+    Device& operator=(const Device&) = delete;
+
+    /** @return What is wrong; empty when the device stands. */
+    std::string start(const Options& options) {
+        if (!options.language.empty())
+            setenv("LANGUAGE", options.language.c_str(), 1);
+        device_host_config_s config{};
+        config.data_dir = orNull(options.dataDir);
+        config.resource_dir = orNull(options.resourceDir);
+        std::array<char, 512> error{};
+        if (device_host_init(&config, error.data(), error.size()) != 0)
+            return error.data();
+        _started = true;
+        return options.twelveHour ? setTimeForm(*options.twelveHour) : "";
+    }
+
+    bool startToolkit() {
+        // A watch has no menus: without this a helper starts that collects the desktop's.
+        efreet_cache_disable();
+        _toolkitUp = elm_init(0, nullptr) > 0;
+        return _toolkitUp && device_host_init_toolkit() == 0;
+    }
+
+private:
+    static std::string setTimeForm(bool twelveHour) {
+        const int form = twelveHour ? TWELVE_HOURS : TWENTY_FOUR_HOURS;
+        return vconf_set_int(TIME_FORM_KEY, form) == VCONF_OK
+                   ? ""
+                   : "the 12/24-hour setting cannot be written";
+    }
+
+    bool _started = false;
+    bool _toolkitUp = false;
+};
+
+/** A desktop's services that the toolkit looks for and a watch does not have. */
+void quietToolkit() {
+    setenv("EINA_LOG_LEVELS",
+           "eldbus:0,eina_safety:0,ecore_system_upower:0,ecore_system_systemd:0,ecore_con:0", 0);
+    setenv("EINA_LOG_BACKTRACE", "-1", 0);
+}
+
+/** The toolkit reports a missing display in many lines: ask before it does. */
+bool hasDisplay() {
+    if (std::getenv("ELM_ENGINE") != nullptr)
+        return true;
+    setenv("ELM_DISPLAY", "x11", 0);
+    const char* name = std::getenv("DISPLAY");
+    return name != nullptr && *name != '\0' && ecore_x_init(nullptr) > 0;
+}
+
+std::string themePath() {
+    app_resource_manager_init();
+    char* path = nullptr;
+    app_resource_manager_get(APP_RESOURCE_TYPE_IMAGE, "edje/simulator.edj", &path);
+    std::string result = path == nullptr ? "" : path;
+    std::free(path);
+    app_resource_manager_release();
+    return result;
+}
+
+bool isStored(int id) {
+    std::vector<ClockAlarmDbData> alarms;
+    ClockAlarmDbModel().getAllAlarmList(alarms);
+    return std::any_of(alarms.begin(), alarms.end(),
+                       [id](const ClockAlarmDbData& alarm) { return alarm.id == id; });
+}
+
+void settingChangedCb(keynode_t*, void*) {
+    ClockEventListener::raise(ClockEventListener::SETTINGS_CHANGED);
+}
+
+void closedCb(void*, Evas_Object*, void*) {
+    elm_exit();
+}
+
+/** The window and what is in it, until the main loop ends. */
+void showClock(const Options& options, const std::string& theme) {
+    app_assist::WWindowController window("clock-sim", FACE_SIZE, FACE_SIZE);
+    if (!window.create(nullptr, nullptr))
+        return;
+    evas_object_smart_callback_add(window.getEvasObj(), "delete,request", closedCb, nullptr);
+    auto* pages = new app_assist::WNaviframeController();
+    pages->setOnEmpty([] { elm_exit(); });
+    window.setBaseController(pages);
+    auto* alarms = new AlarmListViewController(theme);
+    pages->push(alarms);
+    addBezel(window.getEvasObj());
+    const ToastView toasts(window.getEvasObj(), theme);
+    const Keys keys;
+    if (options.create)
+        alarms->createAlarm();
+    else if (options.editId)
+        alarms->editAlarm(*options.editId);
+    evas_object_show(window.getEvasObj());
+    elm_run();
+}
+
+} // namespace
+
+int runWatch(const Options& options) {
+    quietToolkit();
+    Device device;
+    const std::string problem = device.start(options);
+    if (!problem.empty())
+        return fail(problem);
+    const std::string theme = themePath();
+    if (theme.empty())
+        return fail("the theme edje/simulator.edj is missing from the resources");
+    if (options.editId && !isStored(*options.editId))
+        return fail("alarm " + std::to_string(*options.editId) + " is not stored");
+    if (!hasDisplay())
+        return fail("there is no X display; ./run starts a virtual one");
+    if (!device.startToolkit())
+        return fail("the toolkit cannot be started with the device's theme");
+    elm_theme_extension_add(nullptr, theme.c_str());
+    ClockAlarmManagerModel::synchronize();
+    vconf_notify_key_changed(TIME_FORM_KEY, settingChangedCb, nullptr);
+    showClock(options, theme);
+    return EXIT_SUCCESS;
+}
+
+} // namespace simulator
