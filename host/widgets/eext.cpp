@@ -29,9 +29,14 @@ std::vector<Listener>& listeners() {
     return all;
 }
 
-Ecore_Event_Handler*& keyHandler() {
-    static Ecore_Event_Handler* handler = nullptr;
-    return handler;
+struct KeyHandlers {
+    Ecore_Event_Handler* pressed = nullptr;
+    Ecore_Event_Handler* released = nullptr;
+};
+
+KeyHandlers& keyHandlers() {
+    static KeyHandlers handlers;
+    return handlers;
 }
 
 bool isBackKey(const char* name) {
@@ -56,6 +61,12 @@ bool isInWindow(const Evas_Object* object, Ecore_Window window) {
     return evas && ecore_evas_window_get(evas) == window;
 }
 
+/** The toolkit's own page stack pops on a press of Escape; the device's back key is the release. */
+Eina_Bool keyPressed(void*, int, void* info) {
+    return isBackKey(static_cast<Ecore_Event_Key*>(info)->keyname) ? ECORE_CALLBACK_DONE
+                                                                   : ECORE_CALLBACK_PASS_ON;
+}
+
 Eina_Bool keyReleased(void*, int, void* info) {
     const auto* event = static_cast<Ecore_Event_Key*>(info);
     if (!isBackKey(event->keyname))
@@ -72,16 +83,26 @@ Eina_Bool keyReleased(void*, int, void* info) {
     return ECORE_CALLBACK_PASS_ON;
 }
 
-void dropUnusedHandler() {
-    if (!listeners().empty() || !keyHandler())
+void listenToKeys() {
+    KeyHandlers& handlers = keyHandlers();
+    if (handlers.released)
         return;
-    ecore_event_handler_del(keyHandler());
-    keyHandler() = nullptr;
+    handlers.pressed = ecore_event_handler_prepend(ECORE_EVENT_KEY_DOWN, keyPressed, nullptr);
+    handlers.released = ecore_event_handler_add(ECORE_EVENT_KEY_UP, keyReleased, nullptr);
+}
+
+void dropUnusedHandlers() {
+    KeyHandlers& handlers = keyHandlers();
+    if (!listeners().empty() || !handlers.released)
+        return;
+    ecore_event_handler_del(handlers.pressed);
+    ecore_event_handler_del(handlers.released);
+    handlers = {};
 }
 
 void objectDeleted(void*, Evas*, Evas_Object* object, void*) {
     std::erase_if(listeners(), [object](const Listener& l) { return l.object == object; });
-    dropUnusedHandler();
+    dropUnusedHandlers();
 }
 
 bool hasListener(Evas_Object* object) {
@@ -100,8 +121,7 @@ void eext_object_event_callback_add(Evas_Object* obj, eext_event_type_e type,
     if (!hasListener(obj))
         evas_object_event_callback_add(obj, EVAS_CALLBACK_DEL, objectDeleted, nullptr);
     listeners().push_back({obj, callback, data});
-    if (!keyHandler())
-        keyHandler() = ecore_event_handler_add(ECORE_EVENT_KEY_UP, keyReleased, nullptr);
+    listenToKeys();
 }
 
 void* eext_object_event_callback_del(Evas_Object* obj, eext_event_type_e type,
@@ -116,6 +136,6 @@ void* eext_object_event_callback_del(Evas_Object* obj, eext_event_type_e type,
     all.erase(std::next(found).base());
     if (!hasListener(obj))
         evas_object_event_callback_del_full(obj, EVAS_CALLBACK_DEL, objectDeleted, nullptr);
-    dropUnusedHandler();
+    dropUnusedHandlers();
     return data;
 }

@@ -2,8 +2,9 @@
  * @file
  * @brief Civil (wall clock) time and instants, with the time zones of the C library.
  *
- * All arithmetic is done in 64 bits. Where a function takes a time zone, an unknown one counts as
- * the current one.
+ * All arithmetic is done in 64 bits, for the years -9999 to 9999; instants outside count as the
+ * nearest one inside. Changes of offset are known until 2037, where the time-zone files end. Where
+ * a function takes a time zone, an unknown one counts as the current one.
  */
 #pragma once
 
@@ -34,8 +35,8 @@ struct CivilTime {
 
 /**
  * @brief The id of the process's time zone, from TZ or the system's setting.
- * @return An id of the time-zone database, or TZ itself when that is a POSIX rule; "UTC" when there
- *         is neither.
+ * @return An id of the time-zone database; "UTC" when TZ is something else, a POSIX rule for
+ * example.
  */
 std::string currentTimeZone();
 
