@@ -1,5 +1,6 @@
 #include "TimeTexts.h"
 
+#include <map>
 #include <memory>
 
 #include <unicode/dtfmtsym.h>
@@ -92,10 +93,15 @@ std::vector<std::string> TimeTexts::minutes() const {
     return result;
 }
 
-TimeTexts timeTextsOf(const char* locale) {
+const TimeTexts& timeTextsOf(const char* locale) {
     const icu::Locale icuLocale =
         locale && *locale ? icu::Locale::createCanonical(locale) : icu::Locale::getDefault();
-    TimeTexts texts;
+    // A device speaks few languages, and a picker is made many times over.
+    static std::map<std::string, TimeTexts> known;
+    const auto [entry, isNew] = known.try_emplace(icuLocale.getName());
+    TimeTexts& texts = entry->second;
+    if (!isNew)
+        return texts;
     setDigits(texts, icuLocale);
     setHalves(texts, icuLocale);
     setPattern(texts, icuLocale);

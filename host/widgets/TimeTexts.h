@@ -27,6 +27,6 @@ struct TimeTexts {
 };
 
 /** @param locale ICU or POSIX locale id; null for the current one. */
-TimeTexts timeTextsOf(const char* locale);
+const TimeTexts& timeTextsOf(const char* locale);
 
 } // namespace host

@@ -19,12 +19,15 @@ namespace {
 /** The value in the middle and two on either side: what can show at once while it moves. */
 constexpr int DRAWN_VALUES = 5;
 
+constexpr const char* WHEEL_KEY = "device.timewheel";
+
 /** A plain container: its members share one clip and move with it. */
-Evas_Object* addContainer(Evas* canvas) {
-    static Evas_Smart* const smart = [] {
+Evas_Object* addContainer(Evas* canvas, void (*calculate)(Evas_Object*)) {
+    static Evas_Smart* const smart = [calculate] {
         static Evas_Smart_Class container =
             EVAS_SMART_CLASS_INIT_NAME_VERSION("DeviceTimeWheelValues");
         evas_object_smart_clipped_smart_set(&container);
+        container.calculate = calculate;
         return evas_smart_class_new(&container);
     }();
     return evas_object_smart_add(canvas, smart);
@@ -42,7 +45,7 @@ std::unique_ptr<TimeWheel> TimeWheel::create(Evas_Object* parent) {
     std::unique_ptr<TimeWheel> wheel(new TimeWheel(object));
     if (!elm_layout_theme_set(object, theme::LAYOUT_CLASS, theme::PICKER_GROUP,
                               theme::STYLE_WHEEL) ||
-        !wheel->addValueObjects()) {
+        !wheel->addArea()) {
         LOG_ERROR("The theme has no wheel of a time picker");
         evas_object_del(object);
         return nullptr;
@@ -66,26 +69,41 @@ TimeWheel::~TimeWheel() {
     evas_object_event_callback_del_full(_object, EVAS_CALLBACK_MOUSE_UP, _mouseUpCb, this);
     evas_object_event_callback_del_full(_object, EVAS_CALLBACK_MOUSE_WHEEL, _mouseWheelCb, this);
     elm_object_event_callback_del(_object, _keyCb, this);
-    if (_area)
+    if (_area) {
         evas_object_event_callback_del_full(_area, EVAS_CALLBACK_RESIZE, _areaResizedCb, this);
+        evas_object_data_del(_area, WHEEL_KEY);
+    }
 }
 
-bool TimeWheel::addValueObjects() {
+bool TimeWheel::addArea() {
     _stepHeight = dataNumber(_object, theme::DATA_STEP);
     _valueHeight = dataNumber(_object, theme::DATA_VALUE_HEIGHT);
     if (_stepHeight <= 0 || _valueHeight <= 0)
         return false;
-    Evas* canvas = evas_object_evas_get(_object);
-    _area = addContainer(canvas);
+    _area = addContainer(evas_object_evas_get(_object), _calculateCb);
+    evas_object_data_set(_area, WHEEL_KEY, this);
     evas_object_pass_events_set(_area, EINA_TRUE);
+    elm_object_part_content_set(_object, theme::PART_VALUES, _area);
+    return true;
+}
+
+void TimeWheel::addValueObjects() {
+    const char* file = nullptr;
+    edje_object_file_get(elm_layout_edje_get(_object), &file, nullptr);
+    const char* group = _values.words ? theme::GROUP_WORD : theme::GROUP_NUMBER;
     for (int i = 0; i < DRAWN_VALUES; ++i) {
-        Evas_Object* value = edje_object_add(canvas);
+        Evas_Object* value = edje_object_add(evas_object_evas_get(_area));
+        edje_object_file_set(value, file, group);
         evas_object_smart_member_add(value, _area);
         evas_object_show(value);
         _drawn.push_back({value, std::nullopt, -1});
     }
-    elm_object_part_content_set(_object, theme::PART_VALUES, _area);
-    return true;
+}
+
+void TimeWheel::dropValueObjects() {
+    for (const Value& value : _drawn)
+        evas_object_del(value.object);
+    _drawn.clear();
 }
 
 void TimeWheel::listen() {
@@ -102,14 +120,7 @@ void TimeWheel::setValues(Values values) {
     stop();
     endPress();
     _values = std::move(values);
-    const char* file = nullptr;
-    edje_object_file_get(elm_layout_edje_get(_object), &file, nullptr);
-    for (Value& value : _drawn) {
-        edje_object_file_set(value.object, file,
-                             _values.words ? theme::GROUP_WORD : theme::GROUP_NUMBER);
-        value.shown.reset();
-        value.distance = -1;
-    }
+    dropValueObjects();
     setValue(0);
 }
 
@@ -325,12 +336,21 @@ bool TimeWheel::reach(long value) {
 
 void TimeWheel::moveTo(double position) {
     _position = position;
-    draw();
+    if (_area)
+        evas_object_smart_changed(_area);
+}
+
+void TimeWheel::_calculateCb(Evas_Object* area) {
+    // A list makes rows just to measure them: those are gone before anything is drawn.
+    if (auto* wheel = static_cast<TimeWheel*>(evas_object_data_get(area, WHEEL_KEY)))
+        wheel->draw();
 }
 
 void TimeWheel::draw() {
     if (!_object || count() == 0)
         return;
+    if (_drawn.empty())
+        addValueObjects();
     const long middle = std::lround(_position);
     for (int i = 0; i < DRAWN_VALUES; ++i) {
         const long index = middle + i - DRAWN_VALUES / 2;
@@ -373,14 +393,16 @@ void TimeWheel::describe() {
     elm_access_info_set(_object, ELM_ACCESS_INFO, (_name + " " + text).c_str());
 }
 
-void TimeWheel::_areaResizedCb(void* data, Evas*, Evas_Object*, void*) {
-    static_cast<TimeWheel*>(data)->draw();
+void TimeWheel::_areaResizedCb(void*, Evas*, Evas_Object* area, void*) {
+    evas_object_smart_changed(area);
 }
 
 void TimeWheel::_deletedCb(void* data, Evas*, Evas_Object*, void*) {
     auto* wheel = static_cast<TimeWheel*>(data);
     wheel->endPress();
     wheel->stop();
+    if (wheel->_area)
+        evas_object_data_del(wheel->_area, WHEEL_KEY);
     wheel->_object = nullptr;
     wheel->_area = nullptr;
     wheel->_drawn.clear();

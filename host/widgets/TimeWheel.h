@@ -70,14 +70,17 @@ private:
     };
 
     explicit TimeWheel(Evas_Object* object);
-    bool addValueObjects();
+    bool addArea();
+    void addValueObjects();
+    void dropValueObjects();
     void listen();
 
     static void _mouseDownCb(void* data, Evas*, Evas_Object*, void* info);
     static void _mouseMoveCb(void* data, Evas*, Evas_Object*, void* info);
     static void _mouseUpCb(void* data, Evas*, Evas_Object*, void* info);
     static void _mouseWheelCb(void* data, Evas*, Evas_Object*, void* info);
-    static void _areaResizedCb(void* data, Evas*, Evas_Object*, void* info);
+    static void _areaResizedCb(void* data, Evas*, Evas_Object* area, void* info);
+    static void _calculateCb(Evas_Object* area);
     static void _deletedCb(void* data, Evas*, Evas_Object*, void* info);
     static Eina_Bool _keyCb(void* data, Evas_Object*, Evas_Object*, Evas_Callback_Type type,
                             void* info);
