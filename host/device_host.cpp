@@ -64,7 +64,9 @@ int device_host_init(const device_host_config_s* config, char* error, size_t err
     std::string problem;
     host::forgetSettingCallbacks();
     if (!host::prepareFolders(config ? *config : device_host_config_s{}, problem)) {
-        LOG_ERROR("%s", problem.c_str());
+        // The caller who takes the sentence shows it.
+        if (!error)
+            LOG_ERROR("%s", problem.c_str());
         base::copyUtf8(error, error_size, problem);
         return -1;
     }

@@ -93,6 +93,7 @@ private:
     void insertRow(rules::EditorRow row);
     void removeRow(rules::EditorRow row);
     void refreshRow(rules::EditorRow row);
+    void refreshTimePicker();
     app_assist::WGenlistItem* rowAt(rules::EditorRow row) const;
     AlarmTimePickerItem* timePickerRow() const;
     AlarmNameItem* nameRow() const;

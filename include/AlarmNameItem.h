@@ -42,6 +42,9 @@ public:
      *  @{ */
     static char* _getNameItemText(void* data, Evas_Object* genlist, const char* part);
     static Evas_Object* _getNameItemIcon(void* data, Evas_Object* genlist, const char* part);
+    /** @param old The field that the list took away when it put the row aside; may be null. */
+    static Evas_Object* _keepNameItemIcon(void* data, Evas_Object* genlist, const char* part,
+                                          Evas_Object* old);
     static void _alarmNameFocusedCb(void* data, Evas_Object* entry, void* info);
     static void _alarmNameActivatedCb(void* data, Evas_Object* entry, void* info);
     static void _alarmNameChangedCb(void* data, Evas_Object* entry, void* info);

@@ -43,6 +43,9 @@ public:
     /** @brief Brings the strip up to date after the day or the language may have changed. */
     void updateDateText();
 
+    /** @brief Lets the list's next update of the row make its content anew. */
+    void renewContent();
+
     /** @brief The time wheels; null while the row has none. */
     Evas_Object* getDateTimeObj() const { return _datetimes.newest(); }
     /** @brief The strip, with the text part "date.text"; null while the row has none. */
@@ -52,6 +55,9 @@ public:
      *  @{ */
     static Evas_Object* _getTimePickerItemContent(void* data, Evas_Object* genlist,
                                                   const char* part);
+    /** @param old The content that the list took away when it put the row aside; may be null. */
+    static Evas_Object* _keepTimePickerItemContent(void* data, Evas_Object* genlist,
+                                                   const char* part, Evas_Object* old);
     static void _datetimeChangedCb(void* data, Evas_Object* datetime, void* info);
     static void _dateBtnClickedCb(void* data, Evas_Object* button, void* info);
     /** @brief Gives the wheels the form that the settings ask for. */

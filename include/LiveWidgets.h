@@ -27,6 +27,14 @@ public:
     void add(Evas_Object* widget);
     /** @brief The living widget that was added last; null when there is none. */
     Evas_Object* newest() const { return _widgets.empty() ? nullptr : _widgets.back(); }
+    /**
+     * @brief Whether a list may show a widget again instead of asking for a new one.
+     * @param widget What the list has kept; may be null.
+     * @return The widget, or null when it is not the newest one or renew() was called since.
+     */
+    Evas_Object* reusable(Evas_Object* widget) const;
+    /** @brief Lets no widget made so far be shown again. */
+    void renew() { _outdated = true; }
     /** @brief Every living widget, the newest last. */
     const std::vector<Evas_Object*>& all() const { return _widgets; }
 
@@ -34,4 +42,5 @@ private:
     static void _deletedCb(void* data, Evas* evas, Evas_Object* widget, void* info);
 
     std::vector<Evas_Object*> _widgets;
+    bool _outdated = false;
 };

@@ -206,6 +206,12 @@ void AlarmEditViewController::refreshRow(EditorRow place) {
         elm_genlist_item_update(row->getElmObjectItem());
 }
 
+void AlarmEditViewController::refreshTimePicker() {
+    if (AlarmTimePickerItem* row = timePickerRow())
+        row->renewContent();
+    refreshRow(EditorRow::TimePicker);
+}
+
 app_assist::WGenlistItem* AlarmEditViewController::rowAt(EditorRow row) const {
     return _rows.at(rules::placeOf(row));
 }
@@ -240,13 +246,13 @@ void AlarmEditViewController::_onTypePopupViewSelectedCb() {
 void AlarmEditViewController::onEvent(ClockEventListener::EventType type) {
     switch (type) {
     case ClockEventListener::TIME_CHANGED:
-        refreshRow(EditorRow::TimePicker);
+        refreshTimePicker();
         break;
     case ClockEventListener::LANGUAGE_CHANGED:
         _updateDateText();
         setTitle();
         refreshRow(EditorRow::Name);
-        refreshRow(EditorRow::TimePicker);
+        refreshTimePicker();
         break;
     case ClockEventListener::PAUSED:
         app_assist::WUiTimer::destroy(_minuteTimer);

@@ -96,6 +96,8 @@ Elm_Genlist_Item_Class* AlarmNameItem::getItemClassNew() {
     itemClass->item_style = "entry.main";
     itemClass->func.text_get = _getNameItemText;
     itemClass->func.content_get = _getNameItemIcon;
+    // A list makes and drops a row several times to measure it; entries are too costly for that.
+    itemClass->func.reusable_content_get = _keepNameItemIcon;
     itemClass->func.del = deleteCb;
     return itemClass;
 }
@@ -127,6 +129,12 @@ Evas_Object* AlarmNameItem::_getNameItemIcon(void* data, Evas_Object* genlist, c
     if (std::string_view(part ? part : "") != "elm.icon.entry")
         return nullptr;
     return static_cast<AlarmNameItem*>(data)->createEntry(genlist);
+}
+
+Evas_Object* AlarmNameItem::_keepNameItemIcon(void* data, Evas_Object*, const char*,
+                                              Evas_Object* old) {
+    RETURN_IF_NULL(data, nullptr);
+    return static_cast<AlarmNameItem*>(data)->_entries.reusable(old);
 }
 
 Evas_Object* AlarmNameItem::createEntry(Evas_Object* genlist) {

@@ -81,6 +81,8 @@ Elm_Genlist_Item_Class* AlarmTimePickerItem::getItemClassNew() {
     itemClass->item_style = "edit.theme.time";
     itemClass->decorate_item_style = "mode/slide";
     itemClass->func.content_get = _getTimePickerItemContent;
+    // A list makes and drops a row several times to measure it; wheels are too costly for that.
+    itemClass->func.reusable_content_get = _keepTimePickerItemContent;
     itemClass->func.del = deleteCb;
     return itemClass;
 }
@@ -106,6 +108,19 @@ Evas_Object* AlarmTimePickerItem::_getTimePickerItemContent(void* data, Evas_Obj
     if (name == "calendar.area")
         return self->createCalendar(genlist);
     return nullptr;
+}
+
+Evas_Object* AlarmTimePickerItem::_keepTimePickerItemContent(void* data, Evas_Object*, const char*,
+                                                             Evas_Object* old) {
+    RETURN_IF_NULL(data, nullptr);
+    const auto* self = static_cast<AlarmTimePickerItem*>(data);
+    Evas_Object* picker = self->_datetimes.reusable(old);
+    return picker ? picker : self->_calendars.reusable(old);
+}
+
+void AlarmTimePickerItem::renewContent() {
+    _datetimes.renew();
+    _calendars.renew();
 }
 
 Evas_Object* AlarmTimePickerItem::createTimePicker(Evas_Object* genlist) {

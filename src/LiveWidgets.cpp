@@ -12,6 +12,11 @@ void LiveWidgets::add(Evas_Object* widget) {
         return;
     evas_object_event_callback_add(widget, EVAS_CALLBACK_DEL, _deletedCb, this);
     _widgets.push_back(widget);
+    _outdated = false;
+}
+
+Evas_Object* LiveWidgets::reusable(Evas_Object* widget) const {
+    return widget == newest() && !_outdated ? widget : nullptr;
 }
 
 void LiveWidgets::_deletedCb(void* data, Evas*, Evas_Object* widget, void*) {

@@ -29,7 +29,7 @@ typedef struct {
  * with English as the language of last resort, and binds the text domain "clock" as the default
  * one.
  * @param config May be null.
- * @param[out] error Gets one sentence about what is unusable and why; may be null.
+ * @param[out] error Gets one sentence about what is unusable and why; null = it is logged.
  * @return 0, or a negative number.
  */
 DEVICE_API int device_host_init(const device_host_config_s* config, char* error, size_t error_size);

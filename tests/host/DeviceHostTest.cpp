@@ -107,7 +107,7 @@ TEST_F(DeviceHostTest, AFileInAFoldersPlaceIsNamedWithTheReason) {
     writeFile(folder / "file", "");
     EXPECT_LT(init(folder / "file", folder / "run", resources), 0);
     EXPECT_EQ(error, "The data folder " + (folder / "file") + " cannot be used: Not a directory.");
-    EXPECT_THAT(log, HasSubstr(error));
+    EXPECT_EQ(log, "");
     EXPECT_LT(init(folder / "data", folder / "file/run", resources), 0);
     EXPECT_EQ(error,
               "The runtime folder " + (folder / "file/run") + " cannot be used: Not a directory.");
@@ -133,12 +133,12 @@ TEST_F(DeviceHostTest, TheSentenceIsCutToItsBufferAndMayBeLeftOut) {
     const std::string missing = folder / "nothing";
     const device_host_config_s config{data.c_str(), data.c_str(), missing.c_str()};
     char text[8] = "";
-    standardErrorOf([&] {
-        EXPECT_LT(device_host_init(&config, text, sizeof text), 0);
-        EXPECT_LT(device_host_init(&config, nullptr, 100), 0);
-        EXPECT_LT(device_host_init(&config, text, 0), 0);
-    });
+    EXPECT_LT(device_host_init(&config, text, sizeof text), 0);
+    EXPECT_LT(device_host_init(&config, text, 0), 0);
     EXPECT_STREQ(text, "The res");
+    const std::string logged =
+        standardErrorOf([&] { EXPECT_LT(device_host_init(&config, nullptr, 100), 0); });
+    EXPECT_THAT(logged, HasSubstr("The resource folder"));
 }
 
 TEST_F(DeviceHostTest, TheEnvironmentChoosesWhatTheProgramLeavesOpen) {

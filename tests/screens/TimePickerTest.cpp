@@ -444,12 +444,32 @@ TEST_F(TimePickerTest, ASettingThatChangesAfterTheWheelsHaveGoneIsIgnored) {
 
 // Content that comes and goes.
 
-TEST_F(TimePickerTest, ThePointersFollowTheNewestWidgets) {
+void countDeletionCb(void* data, Evas*, Evas_Object*, void*) {
+    ++*static_cast<int*>(data);
+}
+
+TEST_F(TimePickerTest, AnUpdateAloneKeepsTheWidgets) {
     show();
     Evas_Object* picker = row->getDateTimeObj();
     Evas_Object* calendar = row->getCalendarObj();
     elm_genlist_item_update(page->item());
     stage().settle();
+    EXPECT_EQ(row->getDateTimeObj(), picker);
+    EXPECT_EQ(row->getCalendarObj(), calendar);
+    EXPECT_TRUE(stage().canBeSeen(picker));
+}
+
+TEST_F(TimePickerTest, ThePointersFollowTheNewestWidgets) {
+    show();
+    Evas_Object* picker = row->getDateTimeObj();
+    Evas_Object* calendar = row->getCalendarObj();
+    int deletions = 0;
+    for (Evas_Object* widget : {picker, calendar})
+        evas_object_event_callback_add(widget, EVAS_CALLBACK_DEL, countDeletionCb, &deletions);
+    row->renewContent();
+    elm_genlist_item_update(page->item());
+    stage().settle();
+    EXPECT_EQ(deletions, 2);
     EXPECT_NE(row->getDateTimeObj(), nullptr);
     EXPECT_NE(row->getDateTimeObj(), picker);
     EXPECT_NE(row->getCalendarObj(), calendar);

@@ -7,6 +7,7 @@
 #include <Ecore_Evas.h>
 
 #include "app_assist/WContentViewController.h"
+#include "simulator/WatchFace.h"
 #include "support/VirtualClock.h"
 
 namespace {
@@ -37,7 +38,7 @@ Stage::Stage() {
     _naviframe = new app_assist::WNaviframeController;
     _window->setBaseController(_naviframe);
     evas_event_callback_add(canvas(), EVAS_CALLBACK_RENDER_FLUSH_POST, renderedCb, _rendered.get());
-    drawBezel();
+    simulator::addBezel(window());
     // A window of the buffer engine has the focus for the toolkit only after it was without it.
     Ecore_Evas* const ee = ecore_evas_ecore_evas_get(canvas());
     ecore_evas_focus_set(ee, EINA_FALSE);
@@ -89,30 +90,4 @@ bool Stage::settle(double seconds) {
         drawn = *_rendered;
     }
     return quiet == QUIET_FRAMES;
-}
-
-void Stage::drawBezel() {
-    constexpr int samples = 4;
-    Evas_Object* const bezel = evas_object_image_filled_add(canvas());
-    evas_object_image_alpha_set(bezel, EINA_TRUE);
-    evas_object_image_size_set(bezel, SIZE, SIZE);
-    auto* pixels = static_cast<std::uint32_t*>(evas_object_image_data_get(bezel, EINA_TRUE));
-    for (int i = 0; i < SIZE * SIZE; ++i) {
-        const std::div_t place = std::div(i, SIZE);
-        std::uint32_t outside = 0;
-        for (int sample = 0; sample < samples * samples; ++sample) {
-            const std::div_t offset = std::div(sample, samples);
-            const double x = place.rem + (offset.rem + 0.5) / samples - SIZE / 2.0;
-            const double y = place.quot + (offset.quot + 0.5) / samples - SIZE / 2.0;
-            outside += std::hypot(x, y) > SIZE / 2.0 ? 1 : 0;
-        }
-        const std::uint32_t alpha = outside * 255 / (samples * samples);
-        const std::uint32_t grey = alpha * 40 / 255;
-        *pixels++ = alpha << 24 | grey << 16 | grey << 8 | grey;
-    }
-    evas_object_image_data_update_add(bezel, 0, 0, SIZE, SIZE);
-    evas_object_resize(bezel, SIZE, SIZE);
-    evas_object_layer_set(bezel, EVAS_LAYER_MAX);
-    evas_object_pass_events_set(bezel, EINA_TRUE);
-    evas_object_show(bezel);
 }

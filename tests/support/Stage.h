@@ -152,7 +152,6 @@ public:
 private:
     void feedMove(int x, int y);
     void sendKey(int type, const std::string& name, const std::string& text);
-    void drawBezel();
 
     std::unique_ptr<app_assist::WWindowController> _window;
     app_assist::WNaviframeController* _naviframe = nullptr;

@@ -1,3 +1,4 @@
+#include <algorithm>
 #include <regex>
 #include <set>
 #include <string>
@@ -40,8 +41,14 @@ bool looksLikePath(const fs::path& root, const std::string& text) {
     return std::regex_match(text, file);
 }
 
+/** A bare file name may be that of a file anywhere. */
 bool exists(const fs::path& root, const std::string& document, const std::string& path) {
-    return fs::exists(root / path) || fs::exists(root / fs::path(document).parent_path() / path);
+    if (fs::exists(root / path) || fs::exists(root / fs::path(document).parent_path() / path))
+        return true;
+    const auto files = filesOf(root);
+    return path.find('/') == std::string::npos &&
+           std::any_of(files.begin(), files.end(),
+                       [&](const std::string& file) { return file.ends_with("/" + path); });
 }
 
 /** What documents name in backticks, or link to, and is not there. */
@@ -78,7 +85,7 @@ TEST(Documents, ANameWithoutAFileIsFound) {
     tree.plant("docs/HOW.md",
                "`src/A.cpp`, `src/B.cpp`, `db/setting/psmode`, `src/*.cpp`, [t](T.md)");
     tree.plant("README.md", "[how](docs/HOW.md#start) [web](https://example.org/x.md) `docs/NO.md` "
-                            "`build/dev/bin/x` `./run` `GONE.md`");
+                            "`build/dev/bin/x` `./run` `GONE.md` `HOW.md`");
     EXPECT_THAT(missingFiles(tree.root()),
                 ElementsAre("README.md: docs/NO.md", "README.md: ./run", "README.md: GONE.md",
                             "docs/HOW.md: src/B.cpp", "docs/HOW.md: T.md"));
