@@ -49,6 +49,8 @@ void configureTouch() {
     elm_config_magnifier_enable_set(EINA_FALSE);
     elm_config_focus_highlight_enabled_set(EINA_FALSE);
     elm_config_item_select_on_focus_disabled_set(EINA_TRUE);
+    // What takes the focus when a field gives it up must not pull the page away from under it.
+    elm_config_focus_autoscroll_mode_set(ELM_FOCUS_AUTOSCROLL_MODE_NONE);
 }
 
 void configureWindows() {

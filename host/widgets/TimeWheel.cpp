@@ -243,7 +243,26 @@ Eina_Bool TimeWheel::_keyCb(void* data, Evas_Object*, Evas_Object*, Evas_Callbac
     return EINA_TRUE;
 }
 
+bool TimeWheel::isInSight() const {
+    Evas_Coord x = 0;
+    Evas_Coord y = 0;
+    Evas_Coord width = 0;
+    Evas_Coord height = 0;
+    evas_object_geometry_get(_object, &x, &y, &width, &height);
+    for (const Evas_Object* clip = evas_object_clip_get(_object); clip;
+         clip = evas_object_clip_get(clip)) {
+        Eina_Rectangle view;
+        evas_object_geometry_get(clip, &view.x, &view.y, &view.w, &view.h);
+        if (!eina_rectangle_coords_inside(&view, x + width / 2, y + height / 2))
+            return false;
+    }
+    return true;
+}
+
 bool TimeWheel::keyPressed(const std::string& key) {
+    // A wheel that was scrolled away may have the focus still; nobody would see it turn.
+    if (!isInSight())
+        return false;
     if (key == "Up" || key == "KP_Up")
         return step(-1), true;
     if (key == "Down" || key == "KP_Down")

@@ -89,6 +89,8 @@ private:
     void finger(const Evas_Event_Mouse_Move& event);
     void letGo(const Evas_Event_Mouse_Up& event);
     void tapped(int y);
+    /** True when the value in the middle is within every view around it. */
+    bool isInSight() const;
     bool keyPressed(const std::string& key);
     void step(int values);
     void glideTo(long to, double speed);

@@ -71,6 +71,14 @@ const std::vector<Contract>& contracts() {
          "elm/popup/buttons2/popup/default",
          {"elm.swallow.content.button1", "elm.swallow.content.button2"}},
         {DEVICE, "elm/check/base/on&off", {"track", "knob"}},
+        {DEVICE, "elm/check/base/default", {"mark", "ring", "fill", "tick", "event"}},
+        {DEVICE, "elm/radio/base/list", {"mark", "ring", "fill", "event"}},
+        {DEVICE, "elm/layout/list/C/type.2/default", {"elm.swallow.content"}},
+        {DEVICE,
+         "elm/calendar/base/default",
+         {"month_text", "elm,calendar,button,left", "elm,calendar,button,right"}},
+        {DEVICE, "elm/button/base/calendar/decrease/default", {"arrow"}},
+        {DEVICE, "elm/button/base/calendar/increase/default", {"arrow"}},
         {DEVICE, "elm/entry/base-single/default", {"elm.text", "elm.guide"}},
         {DEVICE, "elm/scroller/entry_single/default", {"elm.swallow.content", "line"}},
         {DEVICE,
@@ -139,6 +147,18 @@ TEST_F(ThemeContractTest, EveryRowStyleExistsForBothKindsOfLists) {
             EXPECT_NE(std::find(groups.begin(), groups.end(), compressed), groups.end())
                 << compressed;
         }
+    }
+}
+
+TEST_F(ThemeContractTest, ACalendarHasSevenNamesAndSixWeeks) {
+    Evas_Object* edje = open(DEVICE, "elm/calendar/base/default");
+    for (int day = 0; day < 7; ++day) {
+        const std::string name = "elm.ch_" + std::to_string(day) + ".text";
+        EXPECT_TRUE(edje_object_part_exists(edje, name.c_str())) << name;
+    }
+    for (int cell = 0; cell < 42; ++cell) {
+        const std::string name = "elm.cit_" + std::to_string(cell) + ".text";
+        EXPECT_TRUE(edje_object_part_exists(edje, name.c_str())) << name;
     }
 }
 

@@ -64,6 +64,54 @@ TEST_F(FirstScreenTest, AMirroredFaceSwapsTheTitleButtons) {
     elm_config_mirrored_set(EINA_FALSE);
 }
 
+/** The arrow of the way back. */
+class BackButtonTest : public ScreenTest {
+protected:
+    void SetUp() override {
+        ScreenTest::SetUp();
+        button = elm_button_add(stage().window());
+        elm_object_style_set(button, "naviframe/back_btn/default");
+        evas_object_geometry_set(button, 132, 156, 96, 48);
+        evas_object_show(button);
+        stage().settle();
+    }
+    /** Where the middle line of the disc meets the tip of the arrow. */
+    int tip() {
+        for (int x = 160; x < 200; ++x) {
+            if ((stage().pixel(x, 180) & 0xff) > 200) {
+                return x;
+            }
+        }
+        return 0;
+    }
+
+    Evas_Object* button = nullptr;
+};
+
+TEST_F(BackButtonTest, TheArrowPointsAgainstTheText) {
+    EXPECT_NEAR(tip(), 173, 3);
+    elm_object_mirrored_automatic_set(button, EINA_FALSE);
+    elm_object_mirrored_set(button, EINA_TRUE);
+    stage().settle();
+    EXPECT_NEAR(tip(), 184, 3);
+    elm_object_mirrored_set(button, EINA_FALSE);
+    stage().settle();
+    EXPECT_NEAR(tip(), 173, 3);
+}
+
+TEST_F(BackButtonTest, AWordTakesTheArrowsPlaceAlsoOnAMirroredFace) {
+    elm_object_text_set(button, "Back");
+    elm_object_mirrored_automatic_set(button, EINA_FALSE);
+    elm_object_mirrored_set(button, EINA_TRUE);
+    stage().settle();
+    EXPECT_TRUE(stage().shows("Back"));
+    const char* state = edje_object_part_state_get(elm_layout_edje_get(button), "arrow", nullptr);
+    EXPECT_STREQ(state, "hidden");
+    elm_object_text_set(button, "");
+    stage().settle();
+    EXPECT_NEAR(tip(), 184, 3);
+}
+
 class SwitchTest : public ScreenTest {
 protected:
     Evas_Object* addSwitch() {
@@ -109,6 +157,17 @@ TEST_F(SwitchTest, ProgramsMoveItAtOnceAndTellNobody) {
     stage().settle();
     EXPECT_EQ(knob(check), on);
     EXPECT_EQ(changes, 0);
+}
+
+TEST_F(SwitchTest, AStateOtherThanTheMovementWins) {
+    Evas_Object* check = addSwitch();
+    const int off = knob(check);
+    elm_check_state_set(check, EINA_TRUE);
+    stage().settle();
+    elm_object_signal_emit(check, "elm,activate,check,on", "elm");
+    elm_check_state_set(check, EINA_FALSE);
+    stage().settle();
+    EXPECT_EQ(knob(check), off);
 }
 
 TEST_F(SwitchTest, ADisabledSwitchStays) {
@@ -159,6 +218,22 @@ TEST_F(PopupLookTest, TextsAndButtonsLieInsideTheCircle) {
         EXPECT_TRUE(button.insideCircle()) << text;
         EXPECT_GE(button.height, 48) << text;
     }
+}
+
+TEST_F(PopupLookTest, TheSecondButtonWarns) {
+    ask();
+    const Area cancel = Stage::area(stage().findText("Cancel")->widget);
+    const Area discard = Stage::area(stage().findText("Discard")->widget);
+    const auto red = [](unsigned color) {
+        return static_cast<int>((color >> 16) & 0xff);
+    };
+    const auto blue = [](unsigned color) {
+        return static_cast<int>(color & 0xff);
+    };
+    const unsigned plain = stage().pixel(cancel.x + 24, cancel.middle().y - 18);
+    const unsigned warning = stage().pixel(discard.x + 24, discard.middle().y - 18);
+    EXPECT_LT(red(plain), blue(plain));
+    EXPECT_GT(red(warning), blue(warning) + 10);
 }
 
 TEST_F(PopupLookTest, ADismissedPopupSaysSoOnceItHasFaded) {
