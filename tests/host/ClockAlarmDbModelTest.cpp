@@ -25,7 +25,6 @@ namespace {
 using testing::ElementsAre;
 using testing::HasSubstr;
 using testing::IsEmpty;
-using testing::Not;
 
 class ClockAlarmDbModelTest : public testing::Test {
 protected:
@@ -465,7 +464,7 @@ TEST_F(ClockAlarmDbModelTest, AKilledProcessLosesNoAlarmThatItWasToldIsStored) {
         close(channel[1]);
         std::set<std::int32_t> committed;
         std::int32_t id = 0;
-        const auto enough = static_cast<std::size_t>(5 + round * 3);
+        const auto enough = 5 + 3 * static_cast<std::size_t>(round);
         while (committed.size() < enough && read(channel[0], &id, sizeof id) == sizeof id)
             committed.insert(id);
         kill(writer, SIGKILL);

@@ -253,24 +253,55 @@ TEST_F(FrameworkStageTest, aKeyReachesEachHandlerAndTheFocusedWidgetOnce) {
 }
 
 TEST_F(FrameworkStageTest, picturesTellWhatChanged) {
-    Picture one{2, 2, {0xFF000000, 0xFF102030, 0xFFFFFFFF, 0xFF808080}};
+    const Picture one{2, 2, std::vector<std::uint32_t>(4, 0xFF102030)};
     Picture other = one;
     EXPECT_EQ(comparePictures(one, other, 0).fraction, 0);
     other.pixels[1] += 10;
     EXPECT_EQ(comparePictures(one, other, 10).fraction, 0);
     EXPECT_EQ(comparePictures(one, other, 9).fraction, 0.25);
+    EXPECT_EQ(comparePictures(other, one, 9).fraction, 0.25);
     EXPECT_EQ(comparePictures(one, other, 9).picture.pixels[1], 0xFFFF0000);
     EXPECT_EQ(comparePictures(one, {}, 255).fraction, 1);
 }
 
+TEST_F(FrameworkStageTest, aMovedEdgeIsNoChangeButAMissingLineIs) {
+    constexpr std::uint32_t BLACK = 0xFF000000;
+    constexpr std::uint32_t WHITE = 0xFFFFFFFF;
+    const Picture line{6, 1, {BLACK, BLACK, WHITE, WHITE, BLACK, BLACK}};
+    const Picture moved{6, 1, {BLACK, BLACK, 0xFF606060, WHITE, 0xFFA0A0A0, BLACK}};
+    const Picture missing{6, 1, std::vector<std::uint32_t>(6, BLACK)};
+    EXPECT_EQ(comparePictures(line, moved, 24).fraction, 0);
+    EXPECT_EQ(comparePictures(moved, line, 24).fraction, 0);
+    EXPECT_GT(comparePictures(line, missing, 24).fraction, 0.3);
+    EXPECT_GT(comparePictures(missing, line, 24).fraction, 0.3);
+}
+
 TEST_F(FrameworkStageTest, aScreenshotIsWhatTheFaceShows) {
-    auto* const page = new ButtonPage;
-    stage().push(page);
+    stage().push(new ButtonPage);
+    Evas_Object* const spot = evas_object_rectangle_add(stage().canvas());
+    evas_object_color_set(spot, 0x12, 0x34, 0x56, 0xFF);
+    evas_object_geometry_set(spot, 20, 190, 4, 2);
+    evas_object_layer_set(spot, EVAS_LAYER_MAX);
+    evas_object_show(spot);
+    stage().frames(1);
     const Picture picture = Picture::load(stage().screenshot("stage"));
     ASSERT_EQ(picture.width, Stage::SIZE);
     ASSERT_EQ(picture.height, Stage::SIZE);
-    EXPECT_EQ(picture.pixels[0] & 0xFFFFFF, 0x282828U) << "the bezel";
+    EXPECT_EQ(picture.pixels[190 * Stage::SIZE + 20] & 0xFFFFFF, 0x123456U);
+    EXPECT_NE(picture.pixels[190 * Stage::SIZE + 24] & 0xFFFFFF, 0x123456U);
+    EXPECT_EQ(stage().pixel(23, 191) & 0xFFFFFF, 0x123456U);
     EXPECT_EQ(picture.pixels[0], stage().pixel(0, 0));
+    EXPECT_NE(picture.pixels[0], stage().pixel(180, 350)) << "the bezel";
+}
+
+TEST_F(FrameworkStageTest, keysStillArriveAfterAPictureWasTaken) {
+    auto* const page = new EntryPage;
+    stage().push(page);
+    elm_object_focus_set(page->entry, EINA_TRUE);
+    stage().type("a");
+    EXPECT_FALSE(Picture::load(stage().screenshot("keys")).empty());
+    stage().type("b");
+    EXPECT_STREQ(elm_entry_entry_get(page->entry), "ab");
 }
 
 TEST_F(FrameworkStageTest, aPictureUnlikeTheApprovedOneFailsAndIsLeftBehind) {

@@ -26,5 +26,12 @@ struct PictureDifference {
     Picture picture;     ///< Those pixels in red over a dim copy.
 };
 
-/** @param tolerance Greatest difference of a channel that counts as equal. */
+/**
+ * @brief Compares as the eye does, not bit by bit.
+ *
+ * Another version of the font rasteriser moves edges by a part of a pixel: a pixel counts as equal
+ * when it lies between the colours that the other picture has there and next to it, and the other
+ * way round.
+ * @param tolerance Greatest difference of a channel that counts as equal.
+ */
 PictureDifference comparePictures(const Picture& actual, const Picture& approved, int tolerance);
