@@ -21,6 +21,7 @@
 #include "ClockUiExport.h"
 
 class AlarmNameItem;
+class AlarmRepeatItem;
 class AlarmTimePickerItem;
 
 namespace app_assist {
@@ -90,12 +91,18 @@ private:
     void _createEditViewItems(Evas_Object* genlist);
     app_assist::WGenlistItem* makeRow(rules::EditorRow row);
     app_assist::WGenlistItem* makeTimePickerRow();
+    app_assist::WGenlistItem* makeRepeatRow();
+    app_assist::WGenlistItem* makeTypeRow();
+    void showRepeatScreen();
+    void showTypePopup();
+    void showDatePopup();
     void insertRow(rules::EditorRow row);
     void removeRow(rules::EditorRow row);
     void refreshRow(rules::EditorRow row);
     void refreshTimePicker();
     app_assist::WGenlistItem* rowAt(rules::EditorRow row) const;
     AlarmTimePickerItem* timePickerRow() const;
+    AlarmRepeatItem* repeatRow() const;
     AlarmNameItem* nameRow() const;
     void logMissingSoundRows() const;
 
@@ -120,6 +127,9 @@ private:
     /** By place; null while a row is absent. The genlist owns the rows. */
     std::array<app_assist::WGenlistItem*, ROW_COUNT> _rows{};
     app_assist::WWeakPtr<app_assist::WViewController> _discardPopup;
+    app_assist::WWeakPtr<app_assist::WViewController> _datePopup;
+    app_assist::WWeakPtr<app_assist::WViewController> _typePopup;
+    app_assist::WWeakPtr<app_assist::WViewController> _repeatScreen;
     AlarmEditViewCallerType _callerType;
     ClockAlarmDbData _alarm;
     ClockAlarmDbData _snapshot;

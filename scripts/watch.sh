@@ -13,9 +13,24 @@ WATCH_WHEEL_TOP=100
 WATCH_WHEEL_BOTTOM=225
 WATCH_WHEEL_STEP=54         # height of one value
 WATCH_WHEEL_FEW=3           # so many values can be turned without leaving the display
-WATCH_SCROLL_FROM="60 285"  # scrolls the editor to its end
-WATCH_SCROLL_TO="60 90"
-WATCH_NAME="160 262"        # name field, once the list is scrolled to its end
+WATCH_LIST_BOTTOM="60 285"  # between these, a drag moves a list by most of what it shows
+WATCH_LIST_TOP="60 90"
+WATCH_DATE="180 300"        # date button
+WATCH_REPEAT="120 215"      # rows, once the editor is scrolled by one drag
+WATCH_TYPE="120 303"
+WATCH_NAME="160 232"        # name field, once the editor is scrolled to its end
+WATCH_SNOOZE="120 125"      # row, once it is scrolled back from there by one drag
+WATCH_BACK="180 60"         # title button of the repeat screen
+WATCH_MONDAY="120 265"      # rows of the repeat screen
+WATCH_TUESDAY="120 174"     # once it is scrolled by one drag
+WATCH_WEDNESDAY="120 246"
+WATCH_THURSDAY="120 109"    # once it is scrolled to its end
+WATCH_FRIDAY="120 181"
+WATCH_VIBRATION_AND_SOUND="120 246" # row of the type popup
+WATCH_NEXT_MONTH="266 61"           # calendar: right arrow, and the fourth day of the third week
+WATCH_THIRD_WEDNESDAY="179 177"
+WATCH_SET="225 310"
+WATCH_CALENDAR_CANCEL="134 310"
 WATCH_KEEP="115 276"        # buttons of the discard popup
 WATCH_DISCARD="245 276"
 
@@ -81,13 +96,19 @@ watch_look() {
     import -window root rgb:- | cksum
 }
 
-# watch_settled: waits until the face has stopped moving.
+# Prints the processor time that the simulator has used.
+watch_work() {
+    cut -d ' ' -f 14,15 "/proc/$watch_pid/stat" 2>/dev/null
+}
+
+# watch_settled: waits until the face has stopped moving. On a busy machine it stands still for a
+# while before it moves, so the simulator must have nothing to do either.
 watch_settled() {
     local before now tries=100
-    before=$(watch_look)
+    before=$(watch_look; watch_work)
     while [ $tries -gt 0 ]; do
         sleep 0.15
-        now=$(watch_look)
+        now=$(watch_look; watch_work)
         [ "$now" = "$before" ] && return 0
         before=$now
         tries=$((tries - 1))
@@ -139,10 +160,35 @@ watch_set_time() {
         watch_turn $WATCH_MINUTE_X $((10#${2#*:} - 10#${1#*:}))
 }
 
-# Scrolls the editor to its name field.
-watch_show_name() {
+# watch_scroll: moves a list on by most of what it shows.
+watch_scroll() {
     # shellcheck disable=SC2086
-    watch_drag $WATCH_SCROLL_FROM $WATCH_SCROLL_TO
+    watch_drag $WATCH_LIST_BOTTOM $WATCH_LIST_TOP
+}
+
+# watch_scroll_back: moves a list back as far.
+watch_scroll_back() {
+    # shellcheck disable=SC2086
+    watch_drag $WATCH_LIST_TOP $WATCH_LIST_BOTTOM
+}
+
+# watch_until_still COMMAND...: repeats what moves the face until the face stays as it is.
+watch_until_still() {
+    local before now tries=15
+    before=$(watch_look)
+    while [ $tries -gt 0 ]; do
+        "$@" || return 1
+        now=$(watch_look)
+        [ "$now" = "$before" ] && return 0
+        before=$now
+        tries=$((tries - 1))
+    done
+    return 1
+}
+
+# Scrolls the editor to its name field, which is its last row.
+watch_show_name() {
+    watch_until_still watch_scroll
 }
 
 # watch_key KEY...

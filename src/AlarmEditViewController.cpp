@@ -5,11 +5,19 @@
 #include <string>
 
 #include <app_assist/WGenlistItem.h>
+#include <app_assist/WNaviframeController.h>
 #include <device/app_resource_manager.h>
 
+#include "AlarmDatePopupViewController.h"
 #include "AlarmDiscardPopupViewController.h"
+#include "AlarmIncreaseVolumeItem.h"
 #include "AlarmNameItem.h"
+#include "AlarmRepeatItem.h"
+#include "AlarmRepeatViewController.h"
+#include "AlarmSnoozeItem.h"
 #include "AlarmTimePickerItem.h"
+#include "AlarmTypeItem.h"
+#include "AlarmTypePopupViewController.h"
 #include "NullData.h"
 #include "ThemePath.h"
 #include "rules/AlarmChange.h"
@@ -21,6 +29,9 @@ using rules::EditorRow;
 namespace {
 
 constexpr std::size_t EXPECTED_ALARMS = 20;
+// The rows whose texts the list does not translate by itself.
+constexpr std::array TRANSLATED_ROWS = {EditorRow::Repeat, EditorRow::Type, EditorRow::Snooze,
+                                        EditorRow::IncreaseVolume, EditorRow::Name};
 
 struct ItemClassFree {
     void operator()(Elm_Genlist_Item_Class* itemClass) const {
@@ -46,6 +57,11 @@ presentRows(const std::array<app_assist::WGenlistItem*, rules::EDITOR_ROW_COUNT>
     return present;
 }
 
+// One that is on its way out does not count.
+bool isOpen(const app_assist::WWeakPtr<app_assist::WViewController>& controller) {
+    return controller && !controller->isDying();
+}
+
 } // namespace
 
 AlarmEditViewController::AlarmEditViewController(AlarmEditViewCallerType callerType,
@@ -57,6 +73,9 @@ AlarmEditViewController::AlarmEditViewController(AlarmEditViewCallerType callerT
 AlarmEditViewController::~AlarmEditViewController() {
     if (_genlist)
         evas_object_event_callback_del_full(_genlist, EVAS_CALLBACK_DEL, _genlistDeletedCb, this);
+    // It edits this editor's record.
+    if (isOpen(_repeatScreen))
+        _repeatScreen->destroy();
     if (_resourcesOpen)
         app_resource_manager_release();
     app_assist::WUiTimer::destroy(_minuteTimer);
@@ -162,6 +181,14 @@ app_assist::WGenlistItem* AlarmEditViewController::makeRow(EditorRow row) {
     switch (row) {
     case EditorRow::TimePicker:
         return makeTimePickerRow();
+    case EditorRow::Repeat:
+        return makeRepeatRow();
+    case EditorRow::Type:
+        return makeTypeRow();
+    case EditorRow::Snooze:
+        return new AlarmSnoozeItem(_alarm);
+    case EditorRow::IncreaseVolume:
+        return new AlarmIncreaseVolumeItem(_alarm);
     case EditorRow::Name:
         return new AlarmNameItem(_alarm);
     default:
@@ -171,8 +198,49 @@ app_assist::WGenlistItem* AlarmEditViewController::makeRow(EditorRow row) {
 
 app_assist::WGenlistItem* AlarmEditViewController::makeTimePickerRow() {
     auto* row = new AlarmTimePickerItem(_alarm, _date);
-    row->setDateBtnSelectedCb([] { LOG_WARNING("The date popup is not available"); });
+    row->setDateBtnSelectedCb([this] { showDatePopup(); });
     return row;
+}
+
+app_assist::WGenlistItem* AlarmEditViewController::makeRepeatRow() {
+    auto* row = new AlarmRepeatItem(_alarm);
+    row->setSelectedCb([this] { showRepeatScreen(); });
+    return row;
+}
+
+app_assist::WGenlistItem* AlarmEditViewController::makeTypeRow() {
+    auto* row = new AlarmTypeItem(_alarm);
+    row->setSelectedCb([this] { showTypePopup(); });
+    return row;
+}
+
+void AlarmEditViewController::showDatePopup() {
+    if (isOpen(_datePopup))
+        return;
+    auto* popup = new AlarmDatePopupViewController(_alarm, timePickerRow(), repeatRow(), _date);
+    _datePopup = popup->getWeakPtr();
+    attachPopup(popup);
+}
+
+void AlarmEditViewController::showTypePopup() {
+    if (isOpen(_typePopup))
+        return;
+    auto* popup = new AlarmTypePopupViewController(_alarm);
+    _typePopup = popup->getWeakPtr();
+    popup->setSelectedCb([this] { _onTypePopupViewSelectedCb(); });
+    attachPopup(popup);
+}
+
+void AlarmEditViewController::showRepeatScreen() {
+    if (isOpen(_repeatScreen))
+        return;
+    auto* screen = new AlarmRepeatViewController(_alarm);
+    _repeatScreen = screen->getWeakPtr();
+    screen->setSelectedCb([this] {
+        refreshRow(EditorRow::Repeat);
+        _updateDateText();
+    });
+    getNaviframeController()->push(screen);
 }
 
 void AlarmEditViewController::insertRow(EditorRow place) {
@@ -220,6 +288,10 @@ AlarmTimePickerItem* AlarmEditViewController::timePickerRow() const {
     return static_cast<AlarmTimePickerItem*>(rowAt(EditorRow::TimePicker));
 }
 
+AlarmRepeatItem* AlarmEditViewController::repeatRow() const {
+    return static_cast<AlarmRepeatItem*>(rowAt(EditorRow::Repeat));
+}
+
 AlarmNameItem* AlarmEditViewController::nameRow() const {
     return static_cast<AlarmNameItem*>(rowAt(EditorRow::Name));
 }
@@ -251,7 +323,8 @@ void AlarmEditViewController::onEvent(ClockEventListener::EventType type) {
     case ClockEventListener::LANGUAGE_CHANGED:
         _updateDateText();
         setTitle();
-        refreshRow(EditorRow::Name);
+        for (const EditorRow row : TRANSLATED_ROWS)
+            refreshRow(row);
         refreshTimePicker();
         break;
     case ClockEventListener::PAUSED:
@@ -300,7 +373,7 @@ bool AlarmEditViewController::leaveApplication() {
 
 void AlarmEditViewController::askToDiscard(const std::function<void()>& discard) {
     // One question is enough, however often the page is asked to leave.
-    if (_discardPopup && !_discardPopup->isDying())
+    if (isOpen(_discardPopup))
         return;
     if (_cancelButton)
         elm_object_focus_set(_cancelButton, EINA_TRUE);

@@ -2,8 +2,6 @@
 #define LOG_TAG "alarm-ui-common"
 #include "AlarmEditViewController.h"
 
-#include <clock/ClockText.h>
-
 #include "AlarmTimePickerItem.h"
 #include "NullData.h"
 #include "rules/DateLine.h"
@@ -11,12 +9,13 @@
 #include "rules/WeekdaySet.h"
 
 void AlarmEditViewController::_updateDateText() {
-    constexpr std::size_t MAX_LINE_BYTES = 1023;
+    constexpr std::size_t MAX_SUMMARY_BYTES = 1023;
     std::string text = rules::weekdaySummary(_alarm.repeatWeekly);
     if (text.empty()) {
         const rules::RingDay ring = rules::ringDay(_alarm.hour, _alarm.min, std::time(nullptr));
-        const char* word = ring.today ? "IDS_CLOCK_BODY_TODAY" : "IDS_CLOCK_BODY_TOMORROW";
-        text = rules::wordAndDate(clockText(word), rules::dateText(ring.midnight), MAX_LINE_BYTES);
+        text = rules::dateLineText(ring.today ? rules::DateLine::TodayAndDate
+                                              : rules::DateLine::TomorrowAndDate,
+                                   ring.midnight, MAX_SUMMARY_BYTES);
         _date = ring.day;
     }
     const AlarmTimePickerItem* row = timePickerRow();

@@ -190,20 +190,9 @@ void AlarmTimePickerItem::_calendarDeletedCb(void* data, Evas*, Evas_Object* cal
 std::string AlarmTimePickerItem::ringDateText() {
     _date = rules::localTime(_alarm.autoDate);
     const std::tm now = rules::localTime(std::time(nullptr));
-    switch (rules::dateLine(_date, _alarm.hour, _alarm.min, now)) {
-    case rules::DateLine::TodayAndDate:
-        return rules::wordAndDate(clockText("IDS_CLOCK_BODY_TODAY"),
-                                  rules::dateText(_alarm.autoDate));
-    case rules::DateLine::TomorrowAndDate:
-        return rules::wordAndDate(clockText("IDS_CLOCK_BODY_TOMORROW"),
-                                  rules::dateText(_alarm.autoDate));
-    case rules::DateLine::Date:
-        return rules::dateText(_alarm.autoDate);
-    case rules::DateLine::DateWithYear:
-        return rules::dateText(_alarm.autoDate, rules::DAY_AND_YEAR_SKELETON);
-    case rules::DateLine::Past:
-        break;
-    }
+    const rules::DateLine line = rules::dateLine(_date, _alarm.hour, _alarm.min, now);
+    if (line != rules::DateLine::Past)
+        return rules::dateLineText(line, _alarm.autoDate);
     return repairedDateText();
 }
 
@@ -214,7 +203,7 @@ std::string AlarmTimePickerItem::repairedDateText() {
     std::tm tomorrow = rules::oneDayLater(std::time(nullptr));
     _date = tomorrow;
     const std::time_t midnight = rules::toMidnight(tomorrow);
-    return rules::wordAndDate(clockText("IDS_CLOCK_BODY_TOMORROW"), rules::dateText(midnight));
+    return rules::dateLineText(rules::DateLine::TomorrowAndDate, midnight);
 }
 
 void AlarmTimePickerItem::_datetimeChangedCb(void* data, Evas_Object* datetime, void*) {
@@ -232,9 +221,9 @@ void AlarmTimePickerItem::_datetimeChangedCb(void* data, Evas_Object* datetime, 
     const rules::RingDay ring = rules::ringDay(alarm.hour, alarm.min, std::time(nullptr));
     alarm.autoDate = static_cast<std::int32_t>(ring.midnight);
     self->_date = ring.day;
-    const char* word = ring.today ? "IDS_CLOCK_BODY_TODAY" : "IDS_CLOCK_BODY_TOMORROW";
+    const auto line = ring.today ? rules::DateLine::TodayAndDate : rules::DateLine::TomorrowAndDate;
     if (Evas_Object* calendar = self->getCalendarObj())
-        setDateText(calendar, rules::wordAndDate(clockText(word), rules::dateText(ring.midnight)));
+        setDateText(calendar, rules::dateLineText(line, ring.midnight));
 }
 
 void AlarmTimePickerItem::_dateBtnClickedCb(void* data, Evas_Object*, void*) {

@@ -12,7 +12,12 @@ void selectCb(void* data, Evas_Object* /*genlist*/, void* info) {
         LOG_ERROR("Data is NULL !!");
         return;
     }
-    static_cast<WGenlistItem*>(data)->onSelect(static_cast<Elm_Object_Item*>(info));
+    auto* const item = static_cast<Elm_Object_Item*>(info);
+    // A row is pressed like a button: it does not stay highlighted, and the next tap counts again.
+    if (item != nullptr) {
+        elm_genlist_item_selected_set(item, EINA_FALSE);
+    }
+    static_cast<WGenlistItem*>(data)->onSelect(item);
 }
 
 } // namespace

@@ -35,7 +35,8 @@ public:
     /**
      * @brief The smart callback to pass when appending, with the row as its data.
      *
-     * A null row logs "Data is NULL !!" at error priority.
+     * It unselects the item, so that every tap counts, and runs onSelect(). A null row logs
+     * "Data is NULL !!" at error priority.
      */
     static Evas_Smart_Cb getSelectCb();
 

@@ -3,9 +3,11 @@
 #include <array>
 #include <cstdlib>
 #include <memory>
+#include <tuple>
 
 #include <base/Text.h>
 #include <clock/ClockIcuDataModel.h>
+#include <clock/ClockText.h>
 
 #include "rules/RingDay.h"
 
@@ -31,6 +33,18 @@ void clearPastDate(ClockAlarmDbData& alarm) {
     alarm.repeatWeekly = 0;
 }
 
+void setPickedDate(ClockAlarmDbData& alarm, std::time_t midnight) {
+    alarm.autoDate = static_cast<std::int32_t>(midnight);
+    alarm.manualDate = static_cast<std::int32_t>(midnight);
+    alarm.repeatOnce = 1;
+    alarm.repeatWeekly = 0;
+}
+
+bool isBeforeDay(const std::tm& day, const std::tm& today) {
+    return std::tie(day.tm_year, day.tm_mon, day.tm_mday) <
+           std::tie(today.tm_year, today.tm_mon, today.tm_mday);
+}
+
 std::string currentTimeZone() {
     const std::unique_ptr<char, decltype(&std::free)> zone(ClockIcuDataModel::getCurrentTimeZone(),
                                                            &std::free);
@@ -46,6 +60,22 @@ std::string dateText(std::time_t day, const char* skeleton) {
 
 std::string wordAndDate(const std::string& word, const std::string& date, std::size_t maxBytes) {
     return std::string(base::cutUtf8(word + " - " + date, maxBytes));
+}
+
+std::string dateLineText(DateLine line, std::time_t midnight, std::size_t maxBytes) {
+    switch (line) {
+    case DateLine::TodayAndDate:
+        return wordAndDate(clockText("IDS_CLOCK_BODY_TODAY"), dateText(midnight), maxBytes);
+    case DateLine::TomorrowAndDate:
+        return wordAndDate(clockText("IDS_CLOCK_BODY_TOMORROW"), dateText(midnight), maxBytes);
+    case DateLine::Date:
+        return dateText(midnight);
+    case DateLine::DateWithYear:
+        return dateText(midnight, DAY_AND_YEAR_SKELETON);
+    case DateLine::Past:
+        break;
+    }
+    return {};
 }
 
 } // namespace rules

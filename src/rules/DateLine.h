@@ -24,17 +24,29 @@ DateLine dateLine(const std::tm& ringDay, int hour, int minute, const std::tm& n
 // A one-time alarm without dates: what becomes of one whose day is over.
 void clearPastDate(ClockAlarmDbData& alarm);
 
+// A one-time alarm on a day that was picked; 0 leaves the day to the time of day.
+void setPickedDate(ClockAlarmDbData& alarm, std::time_t midnight);
+
+// True when a day lies before another one.
+bool isBeforeDay(const std::tm& day, const std::tm& today);
+
 // The current time zone's id.
 std::string currentTimeZone();
 
 inline constexpr const char* DAY_SKELETON = "EMMMd";
 inline constexpr const char* DAY_AND_YEAR_SKELETON = "EMMMdyyyy";
 
+inline constexpr std::size_t MAX_LINE_BYTES = 511;
+
 // A day as the current locale writes it, at most 511 bytes.
 std::string dateText(std::time_t day, const char* skeleton = DAY_SKELETON);
 
 // "<word> - <date>", cut to whole characters.
 std::string wordAndDate(const std::string& word, const std::string& date,
-                        std::size_t maxBytes = 511);
+                        std::size_t maxBytes = MAX_LINE_BYTES);
+
+// The line for a ring day, given by its midnight. Empty when the day is over.
+std::string dateLineText(DateLine line, std::time_t midnight,
+                         std::size_t maxBytes = MAX_LINE_BYTES);
 
 } // namespace rules

@@ -124,5 +124,5 @@ check "The end of a session ends it well" watch_stop
 check "The watch starts once more" starts
 kill -KILL "$watch_pid" && wait "$watch_pid" 2>/dev/null
 check "A killed watch loses nothing" is "$(stored)" "$second"
-check "No error was logged" test -z "$(grep -a Critical "$log" | grep -avE "$CHECK_USUAL_ERRORS" | tee /dev/stderr)"
+check "No error was logged" test -z "$(grep -a Critical "$log" | grep -avE "$CHECK_USUAL_ERRORS" | tee -a /dev/stderr)"
 check_end

@@ -4,6 +4,7 @@
 
 #include <gtest/gtest.h>
 
+#include "rules/CatalogueForTest.h"
 #include "rules/RingDay.h"
 #include "rules/TimeZoneForTest.h"
 
@@ -76,6 +77,154 @@ TEST(DateLineTest, ALongLineIsCutWithoutSplittingACharacter) {
     EXPECT_EQ(rules::wordAndDate(std::string(507, 'x'), "ä"), std::string(507, 'x') + " - ");
     EXPECT_EQ(rules::wordAndDate(std::string(506, 'x'), "ä"), std::string(506, 'x') + " - ä");
     EXPECT_EQ(rules::wordAndDate(std::string(2000, 'x'), "y", 1023), std::string(1023, 'x'));
+}
+
+struct ZoneCase {
+    const char* zone;
+    const char* ringDay; // Its midnight.
+    int hour;
+    int minute;
+    const char* now;
+    DateLine line;
+};
+
+class DateLineZoneTest : public testing::TestWithParam<ZoneCase> {};
+
+TEST_P(DateLineZoneTest, ComparesLocalDaysAndTimes) {
+    const ZoneCase& test = GetParam();
+    const TimeZoneForTest zone(test.zone);
+    EXPECT_EQ(rules::dateLine(rules::localTime(at(test.ringDay)), test.hour, test.minute,
+                              rules::localTime(at(test.now))),
+              test.line);
+}
+
+INSTANTIATE_TEST_SUITE_P(Zones, DateLineZoneTest,
+                         testing::Values(
+                             // Offsets of half hours and of quarters.
+                             ZoneCase{"Asia/Kolkata", "2026-11-19 00:00:00", 0, 0,
+                                      "2026-11-18 23:59:59", DateLine::TomorrowAndDate},
+                             ZoneCase{"Asia/Kolkata", "2026-11-19 00:00:00", 0, 1,
+                                      "2026-11-19 00:00:00", DateLine::TodayAndDate},
+                             ZoneCase{"Asia/Kathmandu", "2026-11-18 00:00:00", 23, 59,
+                                      "2026-11-18 23:58:00", DateLine::TodayAndDate},
+                             ZoneCase{"America/St_Johns", "2026-11-18 00:00:00", 23, 59,
+                                      "2026-11-19 00:00:00", DateLine::Past},
+                             // The ends of the earth.
+                             ZoneCase{"Pacific/Kiritimati", "2027-01-01 00:00:00", 0, 0,
+                                      "2026-12-31 23:59:00", DateLine::DateWithYear},
+                             ZoneCase{"Pacific/Pago_Pago", "2026-12-31 00:00:00", 23, 59,
+                                      "2026-12-31 23:59:00", DateLine::Past},
+                             // Days of 23 and of 25 hours.
+                             ZoneCase{"Europe/Berlin", "2026-03-29 00:00:00", 2, 30,
+                                      "2026-03-29 01:59:59", DateLine::TodayAndDate},
+                             ZoneCase{"Europe/Berlin", "2026-03-29 00:00:00", 2, 30,
+                                      "2026-03-29 03:00:00", DateLine::Past},
+                             ZoneCase{"Europe/Berlin", "2026-03-30 00:00:00", 2, 30,
+                                      "2026-03-29 03:00:00", DateLine::TomorrowAndDate},
+                             ZoneCase{"Europe/Berlin", "2026-10-26 00:00:00", 7, 0,
+                                      "2026-10-25 00:30:00", DateLine::TomorrowAndDate},
+                             ZoneCase{"Australia/Lord_Howe", "2026-10-04 00:00:00", 2, 15,
+                                      "2026-10-04 02:30:00", DateLine::Past},
+                             // A day that begins at one o'clock.
+                             ZoneCase{"Asia/Beirut", "2026-03-29 01:00:00", 7, 0,
+                                      "2026-03-28 12:00:00", DateLine::TomorrowAndDate}));
+
+struct BeforeCase {
+    const char* day;
+    const char* today;
+    bool before;
+};
+
+class IsBeforeDayTest : public testing::TestWithParam<BeforeCase> {};
+
+TEST_P(IsBeforeDayTest, LooksAtTheDayAlone) {
+    const TimeZoneForTest zone("Europe/Berlin");
+    EXPECT_EQ(rules::isBeforeDay(rules::localTime(at(GetParam().day)),
+                                 rules::localTime(at(GetParam().today))),
+              GetParam().before);
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    Days, IsBeforeDayTest,
+    testing::Values(BeforeCase{"2026-11-18 00:00:00", "2026-11-18 23:59:59", false},
+                    BeforeCase{"2026-11-18 23:59:59", "2026-11-18 00:00:00", false},
+                    BeforeCase{"2026-11-17 23:59:59", "2026-11-18 00:00:00", true},
+                    BeforeCase{"2026-11-19 00:00:00", "2026-11-18 23:59:59", false},
+                    // A smaller day in a later month, a smaller month in a later year.
+                    BeforeCase{"2026-12-01 00:00:00", "2026-11-30 00:00:00", false},
+                    BeforeCase{"2027-01-01 00:00:00", "2026-12-31 23:59:00", false},
+                    BeforeCase{"2026-10-31 00:00:00", "2026-11-01 00:00:00", true},
+                    BeforeCase{"2025-12-31 23:59:00", "2026-01-01 00:00:00", true},
+                    BeforeCase{"2028-02-29 12:00:00", "2028-03-01 00:00:00", true},
+                    BeforeCase{"2026-03-29 03:00:00", "2026-03-29 01:59:59", false},
+                    BeforeCase{"2026-10-25 00:30:00", "2026-10-25 23:30:00", false}));
+
+TEST(PickedDateTest, MakesAOneTimeAlarmOnThatDay) {
+    ClockAlarmDbData alarm{};
+    alarm.repeatOnce = 0;
+    alarm.repeatWeekly = 127;
+    alarm.hour = 7;
+    rules::setPickedDate(alarm, 1795042800);
+    EXPECT_EQ(alarm.autoDate, 1795042800);
+    EXPECT_EQ(alarm.manualDate, 1795042800);
+    EXPECT_EQ(alarm.repeatOnce, 1);
+    EXPECT_EQ(alarm.repeatWeekly, 0);
+    EXPECT_EQ(alarm.hour, 7);
+}
+
+TEST(PickedDateTest, NoDayTakesBackAnEarlierOne) {
+    ClockAlarmDbData alarm{};
+    alarm.autoDate = alarm.manualDate = 1795042800;
+    alarm.repeatWeekly = 2;
+    rules::setPickedDate(alarm, 0);
+    EXPECT_EQ(alarm.autoDate, 0);
+    EXPECT_EQ(alarm.manualDate, 0);
+    EXPECT_EQ(alarm.repeatOnce, 1);
+    EXPECT_EQ(alarm.repeatWeekly, 0);
+}
+
+TEST(PickedDateTest, TheLastDayOfTheCalendarFits) {
+    const TimeZoneForTest zone("Pacific/Pago_Pago");
+    ClockAlarmDbData alarm{};
+    rules::setPickedDate(alarm, at("2030-12-31 00:00:00"));
+    EXPECT_EQ(civil(alarm.manualDate), "2030-12-31 00:00:00");
+}
+
+class DateLineTextTest : public testing::Test {
+protected:
+    static std::time_t day() { return at("2026-11-18 00:00:00"); }
+
+    const TimeZoneForTest zone{"Asia/Kolkata"};
+};
+
+TEST_F(DateLineTextTest, HasAWordOrAYearOrNone) {
+    const CatalogueForTest english(
+        "en", {{"IDS_CLOCK_BODY_TODAY", "Today"}, {"IDS_CLOCK_BODY_TOMORROW", "Tomorrow"}});
+    EXPECT_EQ(rules::dateLineText(DateLine::TodayAndDate, day()), "Today - Wed, Nov 18");
+    EXPECT_EQ(rules::dateLineText(DateLine::TomorrowAndDate, day()), "Tomorrow - Wed, Nov 18");
+    EXPECT_EQ(rules::dateLineText(DateLine::Date, day()), "Wed, Nov 18");
+    EXPECT_EQ(rules::dateLineText(DateLine::DateWithYear, day()), "Wed, Nov 18, 2026");
+    EXPECT_EQ(rules::dateLineText(DateLine::Past, day()), "");
+}
+
+TEST_F(DateLineTextTest, SpeaksTheCurrentLanguage) {
+    const CatalogueForTest german("de", {{"IDS_CLOCK_BODY_TODAY", "Heute"}});
+    EXPECT_EQ(rules::dateLineText(DateLine::TodayAndDate, day()), "Heute - Mi., 18. Nov.");
+    EXPECT_EQ(rules::dateLineText(DateLine::DateWithYear, day()), "Mi., 18. Nov. 2026");
+}
+
+TEST_F(DateLineTextTest, IsCutAtTheLengthAskedFor) {
+    const CatalogueForTest wordy("en", {{"IDS_CLOCK_BODY_TODAY", std::string(510, 'x') + "ä"},
+                                        {"IDS_CLOCK_BODY_TOMORROW", std::string(1022, 'x') + "ä"}});
+    EXPECT_EQ(rules::dateLineText(DateLine::TodayAndDate, day()), std::string(510, 'x'));
+    EXPECT_EQ(rules::dateLineText(DateLine::TodayAndDate, day(), 1023),
+              std::string(510, 'x') + "ä - Wed, Nov 18");
+    EXPECT_EQ(rules::dateLineText(DateLine::TomorrowAndDate, day(), 1023), std::string(1022, 'x'));
+}
+
+TEST_F(DateLineTextTest, ATranslationIsNoFormat) {
+    const CatalogueForTest hostile("en", {{"IDS_CLOCK_BODY_TODAY", "%n%s"}});
+    EXPECT_EQ(rules::dateLineText(DateLine::TodayAndDate, day()), "%n%s - Wed, Nov 18");
 }
 
 TEST(DateTextTest, WritesADayInTheCurrentZone) {

@@ -69,6 +69,60 @@ TEST_F(EditorDateLineTest, ALineOfTranslationsIsCutAtOneKilobyte) {
     EXPECT_EQ(lineOnLanguageChange(), std::string(1022, 'x'));
 }
 
+TEST_F(EditorDateLineTest, ALineOfRepeatDaysTakesAllOfThem) {
+    ClockAlarmDbData alarm = anAlarm(7, 0);
+    alarm.repeatWeekly = 62;
+    editAlarm(alarm);
+    const TestCatalogue wordy{{"IDS_CLOCK_SBODY_MON_ABB2", std::string(70, 'm')},
+                              {"IDS_CLOCK_SBODY_TUE_ABB2", std::string(62, 't')}};
+    EXPECT_EQ(lineOnLanguageChange().substr(0, 126),
+              std::string(63, 'm') + std::string(62, 't') + " ");
+}
+
+TEST_F(EditorDateLineTest, TheSundayNightBeforeALongDayStaysOnIt) {
+    // 86400 seconds later it is still the day on which the clocks went back.
+    VirtualClock::setNow("Europe/Berlin", "2026-10-25 00:30:00");
+    editAlarm(anAlarm(0, 10));
+    EXPECT_EQ(lineOnLanguageChange(), "Tomorrow - Sun, Oct 25");
+}
+
+TEST_F(EditorDateLineTest, TheLateEveningBeforeAShortDaySkipsIt) {
+    VirtualClock::setNow("Europe/Berlin", "2026-03-28 23:30:00");
+    editAlarm(anAlarm(6, 0));
+    EXPECT_EQ(lineOnLanguageChange(), "Tomorrow - Mon, Mar 30");
+}
+
+TEST_F(EditorDateLineTest, ThePickedDateReturnsWhenTheRowIsMadeAnew) {
+    ClockAlarmDbData alarm = anAlarm(7, 0);
+    alarm.autoDate = alarm.manualDate = static_cast<std::int32_t>(at("2026-12-24 00:00:00"));
+    editAlarm(alarm);
+    EXPECT_EQ(lineOnLanguageChange(), "Thu, Dec 24");
+}
+
+TEST_F(EditorDateLineTest, TheRepeatScreenBringsTheDays) {
+    editAlarm(anAlarm(7, 0));
+    stage().tapRow(elm_genlist_item_next_get(elm_genlist_first_item_get(genlist())));
+    stage().settle();
+    stage().tapText("Every Monday");
+    stage().settle();
+    stage().backKey();
+    stage().settle();
+    EXPECT_EQ(dateText(), "Mon ");
+}
+
+TEST_F(EditorDateLineTest, TheRepeatScreenWithoutDaysBringsTheNextRing) {
+    ClockAlarmDbData alarm = anAlarm(7, 0);
+    alarm.repeatWeekly = 2;
+    editAlarm(alarm);
+    stage().tapRow(elm_genlist_item_next_get(elm_genlist_first_item_get(genlist())));
+    stage().settle();
+    stage().tapText("Every Monday");
+    stage().settle();
+    stage().backKey();
+    stage().settle();
+    EXPECT_EQ(dateText(), "Tomorrow - Thu, Nov 19");
+}
+
 TEST_F(EditorDateLineTest, WithoutTheStripNothingHappens) {
     createAlarm();
     evas_object_del(timePickerRow().getCalendarObj());
@@ -93,6 +147,87 @@ TEST_F(EditorMinuteTimerTest, TheLineFollowsTheMinute) {
         Stage::frames(1);
     Stage::frames(3);
     EXPECT_EQ(dateText(), "Tomorrow - Thu, Nov 19");
+}
+
+struct TurnCase {
+    const char* zone;
+    const char* now; // Less than a minute before something turns.
+    int hour;
+    int minute;
+    const char* before;
+    const char* after;
+};
+
+class EditorMinuteTurnTest : public EditorFixture, public testing::WithParamInterface<TurnCase> {};
+
+TEST_P(EditorMinuteTurnTest, KeepsTheLineCurrent) {
+    const TurnCase& turn = GetParam();
+    VirtualClock::setNow(turn.zone, turn.now);
+    createAlarm();
+    pick(turn.hour, turn.minute);
+    EXPECT_EQ(dateText(), turn.before);
+    Stage::advance(31);
+    EXPECT_EQ(dateText(), turn.after);
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    Moments, EditorMinuteTurnTest,
+    testing::Values(TurnCase{"Europe/Berlin", "2026-11-18 09:41:30", 9, 42, "Today - Wed, Nov 18",
+                             "Tomorrow - Thu, Nov 19"},
+                    TurnCase{"Europe/Berlin", "2026-11-18 09:59:30", 10, 0, "Today - Wed, Nov 18",
+                             "Tomorrow - Thu, Nov 19"},
+                    // Midnight, the ends of a month and of a year, leap day.
+                    TurnCase{"Europe/Berlin", "2026-11-18 23:59:30", 6, 0, "Tomorrow - Thu, Nov 19",
+                             "Today - Thu, Nov 19"},
+                    TurnCase{"Europe/Berlin", "2026-11-18 23:59:30", 0, 0, "Tomorrow - Thu, Nov 19",
+                             "Tomorrow - Fri, Nov 20"},
+                    TurnCase{"Europe/Berlin", "2026-11-30 23:59:30", 6, 0, "Tomorrow - Tue, Dec 1",
+                             "Today - Tue, Dec 1"},
+                    TurnCase{"Europe/Berlin", "2026-12-31 23:59:30", 6, 0, "Tomorrow - Fri, Jan 1",
+                             "Today - Fri, Jan 1"},
+                    TurnCase{"Europe/Berlin", "2028-02-28 23:59:30", 6, 0, "Tomorrow - Tue, Feb 29",
+                             "Today - Tue, Feb 29"},
+                    TurnCase{"Asia/Kolkata", "2026-11-18 23:59:30", 6, 0, "Tomorrow - Thu, Nov 19",
+                             "Today - Thu, Nov 19"},
+                    // The hour from two to three is left out.
+                    TurnCase{"Europe/Berlin", "2026-03-29 01:59:30", 2, 30, "Today - Sun, Mar 29",
+                             "Tomorrow - Mon, Mar 30"},
+                    TurnCase{"Europe/Berlin", "2026-03-29 01:59:30", 3, 0, "Today - Sun, Mar 29",
+                             "Tomorrow - Mon, Mar 30"},
+                    // Half an hour is left out.
+                    TurnCase{"Australia/Lord_Howe", "2026-10-04 01:59:30", 2, 15,
+                             "Today - Sun, Oct 4", "Tomorrow - Mon, Oct 5"}));
+
+TEST_F(EditorMinuteTimerTest, AnHourThatComesTwiceBringsTodayBack) {
+    // Thirty seconds before three o'clock becomes two again.
+    VirtualClock::setNow("Europe/Berlin", "2026-10-25 01:59:30");
+    VirtualClock::setNow(VirtualClock::now() + 3600);
+    createAlarm();
+    pick(2, 30);
+    EXPECT_EQ(dateText(), "Tomorrow - Mon, Oct 26");
+    Stage::advance(31);
+    EXPECT_EQ(dateText(), "Today - Sun, Oct 25");
+}
+
+TEST_F(EditorMinuteTimerTest, APickedDateStaysAsItReadsAtMidnight) {
+    VirtualClock::setNow("Europe/Berlin", "2026-11-18 23:59:30");
+    ClockAlarmDbData alarm = anAlarm(7, 0);
+    alarm.autoDate = alarm.manualDate = static_cast<std::int32_t>(at("2026-11-19 00:00:00"));
+    editAlarm(alarm);
+    EXPECT_EQ(dateText(), "Tomorrow - Thu, Nov 19");
+    Stage::advance(31);
+    EXPECT_EQ(dateText(), "Tomorrow - Thu, Nov 19");
+    ClockEventListener::raise(ClockEventListener::TIME_CHANGED);
+    stage().settle();
+    EXPECT_EQ(dateText(), "Today - Thu, Nov 19");
+}
+
+TEST_F(EditorMinuteTimerTest, RepeatDaysStayAsTheyRead) {
+    ClockAlarmDbData alarm = anAlarm(9, 42);
+    alarm.repeatWeekly = 8;
+    editAlarm(alarm);
+    Stage::advance(61);
+    EXPECT_EQ(dateText(), "Wed ");
 }
 
 TEST_F(EditorMinuteTimerTest, TheLineStaysUntilTheMinuteIsOver) {
