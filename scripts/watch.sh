@@ -96,20 +96,24 @@ watch_look() {
     import -window root rgb:- | cksum
 }
 
-# Prints the processor time that the simulator has used.
+# Prints whether the simulator sleeps (S) or wants the processor, and the time it has used.
 watch_work() {
-    cut -d ' ' -f 14,15 "/proc/$watch_pid/stat" 2>/dev/null
+    cut -d ' ' -f 3,14,15 "/proc/$watch_pid/stat" 2>/dev/null
 }
 
 # watch_settled: waits until the face has stopped moving. On a busy machine it stands still for a
-# while before it moves, so the simulator must have nothing to do either.
+# while before it moves, so the simulator must have nothing to do either, three looks in a row.
 watch_settled() {
-    local before now tries=100
+    local before now still=0 tries=100
     before=$(watch_look; watch_work)
     while [ $tries -gt 0 ]; do
-        sleep 0.15
+        sleep 0.1
         now=$(watch_look; watch_work)
-        [ "$now" = "$before" ] && return 0
+        case $now in
+        "$before") [[ $now = *$'\n'S* ]] && still=$((still + 1)) || still=0 ;;
+        *) still=0 ;;
+        esac
+        [ $still -ge 3 ] && return 0
         before=$now
         tries=$((tries - 1))
     done
