@@ -68,14 +68,15 @@ bool writeEvent(base::SqliteDatabase& database, const char* applicationId, const
 
 LoggingModel& LoggingModel::getInstance() {
     static LoggingModel instance;
-    static const bool initialised = (instance.init(), true);
+    static const bool initialised = (init(), true);
     static_cast<void>(initialised);
     return instance;
 }
 
 void LoggingModel::init() {
+    // Opening makes the file and its table.
     base::SqliteDatabase database(storePath());
-    _ready = openStore(database);
+    openStore(database);
 }
 
 void LoggingModel::insertLog(const char* applicationId, const char* feature, const char* detail,
@@ -87,8 +88,8 @@ void LoggingModel::insertLog(const char* applicationId, const char* feature, con
         return;
     }
     base::SqliteDatabase database(storePath());
-    _ready = openStore(database);
-    if (_ready && !database.transaction(
-                      [&] { return writeEvent(database, applicationId, feature, detail, extra); }))
+    if (openStore(database) && !database.transaction([&] {
+            return writeEvent(database, applicationId, feature, detail, extra);
+        }))
         LOG_ERROR("usage event cannot be stored: %s", database.lastError().c_str());
 }

@@ -35,6 +35,5 @@ private:
     LoggingModel() = default;
     ~LoggingModel() = default;
     /** Prepares the store; runs right after the object was made. */
-    void init();
-    bool _ready = false;
+    static void init();
 };
