@@ -23,7 +23,8 @@ install(EXPORT clock-ui NAMESPACE clock-ui:: FILE clock-ui-targets.cmake DESTINA
 install(DIRECTORY "${PROJECT_SOURCE_DIR}/include/" DESTINATION "${CLOCK_UI_INCLUDE_DIR}" FILES_MATCHING PATTERN "*.h")
 foreach(folder app_assist clock device)
     install(DIRECTORY "${PROJECT_SOURCE_DIR}/platform/${folder}" DESTINATION "${CLOCK_UI_INCLUDE_DIR}"
-        FILES_MATCHING PATTERN "*.h" PATTERN AlarmRing.h EXCLUDE PATTERN WDeferredDeletion.h EXCLUDE)
+        FILES_MATCHING PATTERN "*.h" PATTERN AlarmRing.h EXCLUDE
+        PATTERN CityDatabase.h EXCLUDE PATTERN WDeferredDeletion.h EXCLUDE)
 endforeach()
 install(DIRECTORY "${PROJECT_SOURCE_DIR}/host/include/" DESTINATION "${CLOCK_UI_INCLUDE_DIR}" FILES_MATCHING PATTERN "*.h")
 install(DIRECTORY "${CLOCK_RESOURCE_DIR}/" DESTINATION "${CLOCK_UI_RESOURCE_DIR}" PATTERN "simulator.edj" EXCLUDE)

@@ -27,6 +27,15 @@ bool isTheme(const std::string& path) {
     return groups != nullptr;
 }
 
+/** Symbols that the theme has no picture of: characters of a font that comes with it. */
+void addFonts() {
+    static std::string added;
+    const std::string folder = host::folders().resources + "/fonts";
+    if (added != folder)
+        evas_font_path_global_append(folder.c_str());
+    added = folder;
+}
+
 void forgetTheme() {
     if (!themeInUse().empty())
         elm_theme_overlay_del(nullptr, themeInUse().c_str());
@@ -64,6 +73,7 @@ void configureWindows() {
 
 int device_host_init(const device_host_config_s* config, char* error, size_t error_size) {
     std::string problem;
+    host::forgetVolumeCallback();
     host::forgetSettingCallbacks();
     if (!host::prepareFolders(config ? *config : device_host_config_s{}, problem)) {
         // The caller who takes the sentence shows it.
@@ -92,6 +102,7 @@ int device_host_init_toolkit(void) {
     host::applyLocale();
     configureTouch();
     configureWindows();
+    addFonts();
     forgetTheme();
     elm_theme_overlay_add(nullptr, theme.c_str());
     themeInUse() = theme;
@@ -99,8 +110,10 @@ int device_host_init_toolkit(void) {
 }
 
 void device_host_shutdown(void) {
+    host::forgetVolumeCallback();
     host::forgetSettingCallbacks();
     device_host_set_toast_callback(nullptr, nullptr);
+    host::endFeedback();
     forgetTheme();
     host::forgetFolders();
 }

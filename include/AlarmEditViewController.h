@@ -16,6 +16,8 @@
 #include <app_assist/WUiTimer.h>
 #include <clock/ClockAlarmDbData.h>
 #include <clock/ClockEventListener.h>
+#include <device/app_control.h>
+#include <device/sound_manager.h>
 
 #include "AlarmEditViewCallerType.h"
 #include "ClockUiExport.h"
@@ -23,6 +25,7 @@
 class AlarmNameItem;
 class AlarmRepeatItem;
 class AlarmTimePickerItem;
+class AlarmVolumeItem;
 
 namespace app_assist {
 class WGenlistItem;
@@ -72,7 +75,31 @@ public:
     static bool _updateDateTextTimerCb(void* data);
     /** @} */
 
+    /** @brief Opens the tone picker. */
+    void _onRingToneViewSelectedCb();
+    /**
+     * @brief Takes the tone that the picker answers with.
+     * @param data The editor; one that has gone is recognised and left alone.
+     */
+    static void _onRingToneAppReplyCb(app_control_h request, app_control_h reply,
+                                      app_control_result_e result, void* data);
+
+    /** @name Volume keys, the quick panel and the system's volume; data is the editor.
+     *  @{ */
+    void _registerVolumeKeyGrab();
+    void _unregisterVolumeKeyGrab();
+    void _registerQuickPanelEvent();
+    void _unregisterQuickPanelEvent();
+    static Eina_Bool _volumeKeyDownCb(void* data, int type, void* event);
+    static Eina_Bool _volumeKeyUpCb(void* data, int type, void* event);
+    static Eina_Bool _volumeIncreaseLongPressTimerCb(void* data);
+    static Eina_Bool _volumeDecreaseLongPressTimerCb(void* data);
+    static Eina_Bool _quickPanelStateChangedCb(void* data, int type, void* event);
+    static void _soundManagerVolumeChangedCb(sound_type_e type, unsigned int volume, void* data);
+    /** @} */
+
 protected:
+    void onCreated() override;
     Evas_Object* onCreateView(Evas_Object* parent, void* param) override;
 
 private:
@@ -80,6 +107,7 @@ private:
 
     static void _cancelBtnClickedCb(void* data, Evas_Object* button, void* info);
     static void _doneBtnClickedCb(void* data, Evas_Object* button, void* info);
+    static void _scrollDragStartCb(void* data, Evas_Object* genlist, void* info);
     static void _genlistDeletedCb(void* data, Evas* evas, Evas_Object* genlist, void* info);
 
     Evas_Object* addTitleButton(Elm_Object_Item* naviItem, const char* style, const char* part,
@@ -93,6 +121,11 @@ private:
     app_assist::WGenlistItem* makeTimePickerRow();
     app_assist::WGenlistItem* makeRepeatRow();
     app_assist::WGenlistItem* makeTypeRow();
+    app_assist::WGenlistItem* makeToneRow();
+    app_assist::WGenlistItem* makeSnoozeRow();
+    app_assist::WGenlistItem* makeIncreaseVolumeRow();
+    bool offersRow(rules::EditorRow row) const;
+    void matchToneRowToPowerSaving();
     void showRepeatScreen();
     void showTypePopup();
     void showDatePopup();
@@ -104,11 +137,25 @@ private:
     AlarmTimePickerItem* timePickerRow() const;
     AlarmRepeatItem* repeatRow() const;
     AlarmNameItem* nameRow() const;
+    AlarmVolumeItem* volumeRow() const;
     void logMissingSoundRows() const;
 
     // Date line.
     void _updateDateText();
     void armMinuteTimer();
+
+    // Sound.
+    /** The editor behind a callback's data, or null when it has gone. */
+    static AlarmEditViewController* liveEditor(const void* data);
+    void stopPreview();
+    void _increaseVolume();
+    void _decreaseVolume();
+    void stepAndRepeat(void (AlarmEditViewController::*step)(), Ecore_Task_Cb repeat);
+    Eina_Bool repeatStep(void (AlarmEditViewController::*step)());
+    void stopRepeating();
+    void _updateVolumeAfterQuickPanelStateChange();
+    void endVolumeMirroring();
+    bool _isUPSMode() const;
 
     // Saving.
     void _initialzeAlarmData();
@@ -142,4 +189,11 @@ private:
     /** The day in the date line. */
     std::tm _date{};
     app_assist::WWeakPtr<app_assist::WUiTimer> _minuteTimer;
+    Ecore_Event_Handler* _keyUpHandler = nullptr;
+    Ecore_Event_Handler* _keyDownHandler = nullptr;
+    Ecore_Event_Handler* _quickPanelHandler = nullptr;
+    Ecore_Timer* _longPressTimer = nullptr;
+    bool _longPressEnded = false;
+    /** The window that has the volume keys for this editor. */
+    app_assist::WWeakPtr<app_assist::WViewController> _keyWindow;
 };

@@ -18,6 +18,12 @@ WATCH_LIST_TOP="60 90"
 WATCH_DATE="180 300"        # date button
 WATCH_REPEAT="120 215"      # rows, once the editor is scrolled by one drag
 WATCH_TYPE="120 303"
+WATCH_TYPE_LATER="120 151"  # rows, once it is scrolled by two drags
+WATCH_VOLUME_Y=234
+WATCH_VOLUME_FROM=89        # what answers touches of the slider
+WATCH_VOLUME_WIDTH=226
+WATCH_VOLUME_KNOB=28
+WATCH_TONE="120 311"
 WATCH_NAME="160 232"        # name field, once the editor is scrolled to its end
 WATCH_SNOOZE="120 125"      # row, once it is scrolled back from there by one drag
 WATCH_BACK="180 60"         # title button of the repeat screen
@@ -26,7 +32,10 @@ WATCH_TUESDAY="120 174"     # once it is scrolled by one drag
 WATCH_WEDNESDAY="120 246"
 WATCH_THURSDAY="120 109"    # once it is scrolled to its end
 WATCH_FRIDAY="120 181"
-WATCH_VIBRATION_AND_SOUND="120 246" # row of the type popup
+WATCH_SOUND="120 104"               # rows of the type popup
+WATCH_VIBRATION="120 176"
+WATCH_VIBRATION_AND_SOUND="120 246"
+WATCH_TONE_BELOW="120 258"          # row of the tone picker, below the one that is marked at first
 WATCH_NEXT_MONTH="266 61"           # calendar: right arrow, and the fourth day of the third week
 WATCH_THIRD_WEDNESDAY="179 177"
 WATCH_SET="225 310"
@@ -47,14 +56,19 @@ watch_wait() {
     done
 }
 
-# watch_display DIRECTORY: starts a display of its own and a window manager on it.
+# watch_display DIRECTORY [bare]: starts a display of its own, and a window manager on it unless it is
+# to be bare.
 watch_display() {
     local number=$1/display-number
-    Xvfb -displayfd 3 -screen 0 360x360x24 -nolisten tcp 3>"$number" 2>"$1/xvfb.log" &
+    # The number of an earlier display must not be taken for this one's.
+    rm -f "$number"
+    # Without -noreset it starts anew when its last client goes, and refuses the next one meanwhile.
+    Xvfb -displayfd 3 -screen 0 360x360x24 -nolisten tcp -noreset 3>"$number" 2>"$1/xvfb.log" &
     watch_pids+=($!)
     watch_wait 20 test -s "$number" || return 1
     DISPLAY=:$(cat "$number")
     export DISPLAY
+    [ "${2-}" = bare ] && watch_wait 20 xdotool getmouselocation && return
     matchbox-window-manager -use_titlebar no >"$1/window-manager.log" 2>&1 &
     watch_pids+=($!)
     watch_wait 20 xdotool getmouselocation
@@ -162,6 +176,23 @@ watch_turn() {
 watch_set_time() {
     watch_turn $WATCH_HOUR_X $((10#${2%:*} - 10#${1%:*})) &&
         watch_turn $WATCH_MINUTE_X $((10#${2#*:} - 10#${1#*:}))
+}
+
+# watch_tap_volume LEVEL: touches the slider's track. A touch of the knob itself leaves it as it is.
+watch_tap_volume() {
+    watch_tap $((WATCH_VOLUME_FROM + (WATCH_VOLUME_WIDTH * $1 + 7) / 15)) $WATCH_VOLUME_Y
+}
+
+# watch_drag_volume FROM TO: takes the knob from one level to another.
+watch_drag_volume() {
+    local from=$((WATCH_VOLUME_FROM + WATCH_VOLUME_KNOB / 2)) width=$((WATCH_VOLUME_WIDTH - WATCH_VOLUME_KNOB))
+    watch_drag $((from + width * $1 / 15)) $WATCH_VOLUME_Y $((from + width * $2 / 15)) $WATCH_VOLUME_Y
+}
+
+# watch_hold KEY SECONDS: holds a key down; the keyboard repeats it.
+watch_hold() {
+    xdotool keydown "$1" sleep "$2" keyup "$1"
+    watch_settled
 }
 
 # watch_scroll: moves a list on by most of what it shows.

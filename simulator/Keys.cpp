@@ -3,9 +3,12 @@
 #include <algorithm>
 #include <array>
 #include <string_view>
+#include <utility>
 
 #include <Ecore_Input.h>
 
+#include "PowerSaving.h"
+#include "VolumeKeys.h"
 #include "clock/ClockEventListener.h"
 
 #define LOG_TAG "clock-sim"
@@ -14,40 +17,62 @@
 namespace simulator {
 namespace {
 
+using QuickPanel = std::function<void()>;
+
 struct KeyRow {
     const char* key;
-    ClockEventListener::EventType event;
     const char* help;
+    void (*act)(const QuickPanel& quickPanel);
 };
 
-constexpr std::array<KeyRow, 5> KEY_ROWS{{
-    {"F5", ClockEventListener::PAUSED, "the application goes to the background"},
-    {"F6", ClockEventListener::RESUMED, "the application comes back"},
-    {"F7", ClockEventListener::LANGUAGE_CHANGED, "the language was changed"},
-    {"F8", ClockEventListener::TIME_CHANGED, "the clock or the time zone was set"},
-    {"F9", ClockEventListener::SETTINGS_CHANGED, "a setting was changed"},
+template <ClockEventListener::EventType EVENT>
+void raise(const QuickPanel&) {
+    ClockEventListener::raise(EVENT);
+}
+
+constexpr std::array<KeyRow, 7> KEY_ROWS{{
+    {"F4", "the quick panel is pulled down or pushed up",
+     [](const QuickPanel& quickPanel) {
+         quickPanel();
+     }},
+    {"F5", "the application goes to the background", raise<ClockEventListener::PAUSED>},
+    {"F6", "the application comes back", raise<ClockEventListener::RESUMED>},
+    {"F7", "the language was changed", raise<ClockEventListener::LANGUAGE_CHANGED>},
+    {"F8", "the clock or the time zone was set", raise<ClockEventListener::TIME_CHANGED>},
+    {"F9", "a setting was changed", raise<ClockEventListener::SETTINGS_CHANGED>},
+    {"F10", "ultra power saving is switched on or off",
+     [](const QuickPanel&) {
+         togglePowerSaving();
+     }},
 }};
 
-Eina_Bool keyDownCb(void*, int, void* info) {
+} // namespace
+
+Keys::Keys(std::function<void()> quickPanel)
+    : _quickPanel(std::move(quickPanel)),
+      _handler(ecore_event_handler_add(ECORE_EVENT_KEY_DOWN, _keyDownCb, this)) {}
+
+Eina_Bool Keys::_keyDownCb(void* data, int, void* info) {
     const auto* event = static_cast<const Ecore_Event_Key*>(info);
     const auto* row = std::find_if(KEY_ROWS.begin(), KEY_ROWS.end(), [event](const KeyRow& r) {
         return std::string_view(event->keyname) == r.key;
     });
     if (row != KEY_ROWS.end()) {
         LOG_INFO("%s: %s", row->key, row->help);
-        ClockEventListener::raise(row->event);
+        row->act(static_cast<Keys*>(data)->_quickPanel);
     }
     return ECORE_CALLBACK_PASS_ON;
 }
 
-} // namespace
-
-Keys::Keys() : _handler(ecore_event_handler_add(ECORE_EVENT_KEY_DOWN, keyDownCb, nullptr)) {}
-
 std::string keysHelpText() {
-    std::string text = "  Escape, XF86Back  the back key\n";
+    constexpr std::size_t NAME_WIDTH = 26;
+    const auto line = [](std::string name, const char* help) {
+        name.resize(NAME_WIDTH, ' ');
+        return "  " + name + help + "\n";
+    };
+    std::string text = line("Escape, XF86Back", "the back key") + volumeKeysHelpText();
     for (const KeyRow& row : KEY_ROWS)
-        text += std::string("  ") + row.key + "                " + row.help + "\n";
+        text += line(row.key, row.help);
     return text;
 }
 

@@ -4,6 +4,7 @@
  */
 #pragma once
 
+#include <functional>
 #include <memory>
 #include <string>
 
@@ -11,15 +12,21 @@
 
 namespace simulator {
 
-/** @brief While it lives, function keys raise application-wide events. */
+/** @brief While it lives, function keys do what happens to a device. */
 class Keys {
 public:
-    Keys();
+    /** @param quickPanel Pulls the quick panel down or pushes it up. */
+    explicit Keys(std::function<void()> quickPanel);
+    Keys(const Keys&) = delete;
+    Keys& operator=(const Keys&) = delete;
 
 private:
     struct HandlerDeleter {
         void operator()(Ecore_Event_Handler* handler) const { ecore_event_handler_del(handler); }
     };
+    static Eina_Bool _keyDownCb(void* data, int type, void* info);
+
+    std::function<void()> _quickPanel;
     std::unique_ptr<Ecore_Event_Handler, HandlerDeleter> _handler;
 };
 

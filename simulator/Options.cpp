@@ -34,17 +34,35 @@ std::string applyLanguage(Options& options, const std::string& value) {
                : "needs a language code such as en or pt_BR";
 }
 
-std::string applyEdit(Options& options, const std::string& value) {
-    int id = 0;
+/** A whole number from 0 on. */
+std::optional<int> numberOf(const std::string& value) {
+    int number = 0;
     const char* end = value.data() + value.size();
-    const auto [stop, failure] = std::from_chars(value.data(), end, id);
-    if (failure != std::errc() || stop != end || id < 0)
-        return "needs the number of an alarm";
-    options.editId = id;
+    const auto [stop, failure] = std::from_chars(value.data(), end, number);
+    if (failure != std::errc() || stop != end || number < 0)
+        return std::nullopt;
+    return number;
+}
+
+std::string applyEdit(Options& options, const std::string& value) {
+    options.editId = numberOf(value);
+    return options.editId ? "" : "needs the number of an alarm";
+}
+
+std::string applyVolume(Options& options, const std::string& value) {
+    constexpr int LOUDEST = 15;
+    options.volume = numberOf(value);
+    return options.volume && *options.volume <= LOUDEST ? "" : "needs a level from 0 to 15";
+}
+
+std::string applyPowerSaving(Options& options, const std::string& value) {
+    if (value != "on" && value != "off")
+        return "needs 'on' or 'off'";
+    options.powerSaving = value == "on";
     return "";
 }
 
-constexpr std::array<OptionRow, 9> OPTION_ROWS{{
+constexpr std::array<OptionRow, 11> OPTION_ROWS{{
     {"--data", "DIR", "keep settings and alarms in DIR",
      [](Options& o, const std::string& v) {
          return applyDirectory(o.dataDir, v);
@@ -70,6 +88,8 @@ constexpr std::array<OptionRow, 9> OPTION_ROWS{{
          return std::string();
      }},
     {"--edit", "ID", "open the editor on a stored alarm", applyEdit},
+    {"--set-volume", "LEVEL", "set the alarm's volume, 0 to 15, and end", applyVolume},
+    {"--power-saving", "on|off", "switch ultra power saving and end", applyPowerSaving},
     {"--version", nullptr, "print the version",
      [](Options& o, const std::string&) {
          o.version = true;
@@ -118,11 +138,13 @@ Options parseOptions(const std::vector<std::string>& arguments) {
         options.error = applyNext(options, arguments, next);
     if (options.error.empty() && options.create && options.editId)
         options.error = "options '--create' and '--edit' exclude each other";
+    if (options.error.empty() && options.onlySets() && (options.create || options.editId))
+        options.error = "the watch does not start to set '--set-volume' or '--power-saving'";
     return options;
 }
 
 std::string helpText() {
-    constexpr std::size_t NAME_WIDTH = 18;
+    constexpr std::size_t NAME_WIDTH = 26;
     std::string text = "usage: clock-sim [options]\n\n"
                        "A watch with the clock application, in a window.\n\nOptions:\n";
     for (const OptionRow& row : OPTION_ROWS) {
@@ -133,8 +155,9 @@ std::string helpText() {
         text += "  " + name + row.help + "\n";
     }
     text += "\nKeys:\n" + keysHelpText();
-    text += "\nExit status: 0 after a normal end, 1 when the watch cannot start, 2 for a command "
-            "line\nthat makes no sense.\n";
+    text +=
+        "\nExit status: 0 after a normal end, 1 when the watch cannot start, 2 for a command "
+        "line\nthat makes no sense. A watch that runs takes over what another clock-sim sets.\n";
     return text;
 }
 

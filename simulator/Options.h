@@ -14,13 +14,18 @@ namespace simulator {
 struct Options {
     bool help = false;
     bool version = false;
-    bool create = false;            ///< Open the editor for a new alarm at once.
-    std::optional<int> editId;      ///< Open the editor on a stored alarm at once.
-    std::optional<bool> twelveHour; ///< Set the device to 12 or to 24 hours.
+    bool create = false;             ///< Open the editor for a new alarm at once.
+    std::optional<int> editId;       ///< Open the editor on a stored alarm at once.
+    std::optional<bool> twelveHour;  ///< Set the device to 12 or to 24 hours.
+    std::optional<int> volume;       ///< Set the alarm's level, and no more.
+    std::optional<bool> powerSaving; ///< Switch ultra power saving, and no more.
     std::string dataDir;
     std::string resourceDir;
     std::string language;
     std::string error; ///< Why the command line makes no sense; empty when it does.
+
+    /** True when only settings are written, for a watch that may be running. */
+    bool onlySets() const { return volume.has_value() || powerSaving.has_value(); }
 };
 
 /** @brief Reads a command line. @param arguments Without the program's name. */

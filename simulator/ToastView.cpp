@@ -21,8 +21,7 @@ ToastView::ToastView(Evas_Object* window, const std::string& theme)
     if (!elm_layout_file_set(_layout, theme.c_str(), "simulator/toast"))
         LOG_ERROR("'%s' has no toast", theme.c_str());
     evas_object_resize(_layout, FACE_SIZE, FACE_SIZE);
-    // Right below the bezel.
-    evas_object_layer_set(_layout, EVAS_LAYER_MAX - 1);
+    evas_object_layer_set(_layout, LAYER_TOAST);
     evas_object_show(_layout);
     device_host_set_toast_callback(_toastCb, this);
 }

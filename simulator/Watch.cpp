@@ -12,8 +12,13 @@
 #include <Elementary.h>
 
 #include "AlarmListViewController.h"
+#include "Foreground.h"
 #include "Keys.h"
+#include "PowerSaving.h"
+#include "QuickPanel.h"
 #include "ToastView.h"
+#include "VolumeKeys.h"
+#include "VolumeView.h"
 #include "WatchFace.h"
 #include "app_assist/WNaviframeController.h"
 #include "app_assist/WWindowController.h"
@@ -21,6 +26,7 @@
 #include "clock/ClockAlarmManagerModel.h"
 #include "clock/ClockEventListener.h"
 #include "device/app_resource_manager.h"
+#include "device/sound_manager.h"
 #include "device/vconf.h"
 #include "device_host.h"
 
@@ -64,7 +70,7 @@ public:
         if (device_host_init(&config, error.data(), error.size()) != 0)
             return error.data();
         _started = true;
-        return options.twelveHour ? setTimeForm(*options.twelveHour) : "";
+        return writeSettings(options);
     }
 
     bool startToolkit() {
@@ -75,11 +81,19 @@ public:
     }
 
 private:
-    static std::string setTimeForm(bool twelveHour) {
+    static bool setTimeForm(bool twelveHour) {
         const int form = twelveHour ? TWELVE_HOURS : TWENTY_FOUR_HOURS;
-        return vconf_set_int(TIME_FORM_KEY, form) == VCONF_OK
-                   ? ""
-                   : "the 12/24-hour setting cannot be written";
+        return vconf_set_int(TIME_FORM_KEY, form) == VCONF_OK;
+    }
+    static std::string writeSettings(const Options& options) {
+        if (options.twelveHour && !setTimeForm(*options.twelveHour))
+            return "the 12/24-hour setting cannot be written";
+        if (options.volume &&
+            sound_manager_set_volume(SOUND_TYPE_ALARM, *options.volume) != SOUND_MANAGER_ERROR_NONE)
+            return "the alarm's volume cannot be written";
+        if (options.powerSaving && !setPowerSaving(*options.powerSaving))
+            return "the power saving setting cannot be written";
+        return "";
     }
 
     bool _started = false;
@@ -127,6 +141,45 @@ void closedCb(void*, Evas_Object*, void*) {
     elm_exit();
 }
 
+/** Tells a window about the quick panel, as the system's own window does. */
+void sendQuickPanelState(Evas_Object* window, bool shown) {
+    const Ecore_X_Window xWindow = elm_win_xwindow_get(window);
+    if (xWindow == 0)
+        return;
+    ecore_x_client_message32_send(xWindow, ECORE_X_ATOM_E_ILLUME_QUICKPANEL_STATE,
+                                  ECORE_X_EVENT_MASK_NONE,
+                                  static_cast<long>(shown ? ECORE_X_ATOM_E_ILLUME_QUICKPANEL_ON
+                                                          : ECORE_X_ATOM_E_ILLUME_QUICKPANEL_OFF),
+                                  0, 0, 0, 0);
+}
+
+/** What the system draws over the application and does with keys that nobody has taken. */
+class System {
+public:
+    System(Evas_Object* window, const std::string& theme)
+        : _toasts(window, theme), _volume(window, theme),
+          _panel(window, theme, [window](bool shown) { sendQuickPanelState(window, shown); }),
+          _keys([this] { _panel.toggle(); }), _volumeKeys([this](int level) { showVolume(level); }),
+          _foreground(window) {
+        addBezel(window);
+    }
+
+private:
+    void showVolume(int level) {
+        if (_panel.isShown())
+            _panel.refresh();
+        else
+            _volume.show(level);
+    }
+
+    ToastView _toasts;
+    VolumeView _volume;
+    QuickPanel _panel;
+    Keys _keys;
+    VolumeKeys _volumeKeys;
+    Foreground _foreground;
+};
+
 /** The window and what is in it, until the main loop ends. */
 void showClock(const Options& options, const std::string& theme) {
     app_assist::WWindowController window("clock-sim", FACE_SIZE, FACE_SIZE);
@@ -138,9 +191,7 @@ void showClock(const Options& options, const std::string& theme) {
     window.setBaseController(pages);
     auto* alarms = new AlarmListViewController(theme);
     pages->push(alarms);
-    addBezel(window.getEvasObj());
-    const ToastView toasts(window.getEvasObj(), theme);
-    const Keys keys;
+    const System system(window.getEvasObj(), theme);
     if (options.create)
         alarms->createAlarm();
     else if (options.editId)
@@ -157,6 +208,8 @@ int runWatch(const Options& options) {
     const std::string problem = device.start(options);
     if (!problem.empty())
         return fail(problem);
+    if (options.onlySets())
+        return EXIT_SUCCESS;
     const std::string theme = themePath();
     if (theme.empty())
         return fail("the theme edje/simulator.edj is missing from the resources");

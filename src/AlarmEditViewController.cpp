@@ -3,6 +3,7 @@
 
 #include <memory>
 #include <string>
+#include <unordered_set>
 
 #include <app_assist/WGenlistItem.h>
 #include <app_assist/WNaviframeController.h>
@@ -16,8 +17,10 @@
 #include "AlarmRepeatViewController.h"
 #include "AlarmSnoozeItem.h"
 #include "AlarmTimePickerItem.h"
+#include "AlarmToneItem.h"
 #include "AlarmTypeItem.h"
 #include "AlarmTypePopupViewController.h"
+#include "AlarmVolumeItem.h"
 #include "NullData.h"
 #include "ThemePath.h"
 #include "rules/AlarmChange.h"
@@ -30,7 +33,8 @@ namespace {
 
 constexpr std::size_t EXPECTED_ALARMS = 20;
 // The rows whose texts the list does not translate by itself.
-constexpr std::array TRANSLATED_ROWS = {EditorRow::Repeat, EditorRow::Type, EditorRow::Snooze,
+constexpr std::array TRANSLATED_ROWS = {EditorRow::Repeat,         EditorRow::Type,
+                                        EditorRow::Tone,           EditorRow::Snooze,
                                         EditorRow::IncreaseVolume, EditorRow::Name};
 
 struct ItemClassFree {
@@ -62,15 +66,25 @@ bool isOpen(const app_assist::WWeakPtr<app_assist::WViewController>& controller)
     return controller && !controller->isDying();
 }
 
+// Answers of other applications and of the system may come after the editor they were meant for.
+std::unordered_set<const void*>& liveEditors() {
+    static std::unordered_set<const void*> editors;
+    return editors;
+}
+
 } // namespace
 
 AlarmEditViewController::AlarmEditViewController(AlarmEditViewCallerType callerType,
                                                  const ClockAlarmDbData& alarm, bool isCreate)
     : _callerType(callerType), _alarm(alarm), _snapshot(), _isCreate(isCreate) {
     _alarmList.reserve(EXPECTED_ALARMS);
+    liveEditors().insert(this);
 }
 
 AlarmEditViewController::~AlarmEditViewController() {
+    liveEditors().erase(this);
+    _unregisterVolumeKeyGrab();
+    _unregisterQuickPanelEvent();
     if (_genlist)
         evas_object_event_callback_del_full(_genlist, EVAS_CALLBACK_DEL, _genlistDeletedCb, this);
     // It edits this editor's record.
@@ -79,6 +93,15 @@ AlarmEditViewController::~AlarmEditViewController() {
     if (_resourcesOpen)
         app_resource_manager_release();
     app_assist::WUiTimer::destroy(_minuteTimer);
+}
+
+AlarmEditViewController* AlarmEditViewController::liveEditor(const void* data) {
+    const auto& editors = liveEditors();
+    if (!editors.contains(data)) {
+        LOG_WARNING("The editor has gone, nothing to do");
+        return nullptr;
+    }
+    return static_cast<AlarmEditViewController*>(const_cast<void*>(data));
 }
 
 const char* AlarmEditViewController::getClassName() const {
@@ -96,9 +119,15 @@ Evas_Object* AlarmEditViewController::onCreateView(Evas_Object* parent, void*) {
     evas_object_size_hint_weight_set(genlist, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
     evas_object_size_hint_align_set(genlist, EVAS_HINT_FILL, EVAS_HINT_FILL);
     evas_object_event_callback_add(genlist, EVAS_CALLBACK_DEL, _genlistDeletedCb, this);
+    evas_object_smart_callback_add(genlist, "scroll,drag,start", _scrollDragStartCb, this);
     _initialzeAlarmData();
     _createEditViewItems(genlist);
     return genlist;
+}
+
+void AlarmEditViewController::onCreated() {
+    _registerVolumeKeyGrab();
+    _registerQuickPanelEvent();
 }
 
 void AlarmEditViewController::addThemeExtension() {
@@ -106,6 +135,15 @@ void AlarmEditViewController::addThemeExtension() {
     // The toolkit would add it again each time the editor opens, and rebuild every widget.
     if (!path.empty() && !isThemeExtension(path))
         elm_theme_extension_add(nullptr, path.c_str());
+}
+
+void AlarmEditViewController::_scrollDragStartCb(void* data, Evas_Object*, void*) {
+    RETURN_IF_NULL(data);
+    auto* self = static_cast<AlarmEditViewController*>(data);
+    if (self->_alarm.type == CLOCK_ALARM_TYPE_VIBRATION)
+        return;
+    if (AlarmVolumeItem* row = self->volumeRow())
+        row->stopSound();
 }
 
 void AlarmEditViewController::_genlistDeletedCb(void* data, Evas*, Evas_Object*, void*) {
@@ -164,7 +202,7 @@ void AlarmEditViewController::_createEditViewItems(Evas_Object* genlist) {
     _genlist = genlist;
     _date = rules::localTime(std::time(nullptr));
     for (const EditorRow row : rules::EDITOR_ROWS)
-        if (rules::hasRow(row, _alarm.type))
+        if (offersRow(row))
             insertRow(row);
     logMissingSoundRows();
     armMinuteTimer();
@@ -177,6 +215,10 @@ void AlarmEditViewController::logMissingSoundRows() const {
     LOG_ERROR("Sound Type is [%d]. So there is no Increase Volume", _alarm.type);
 }
 
+bool AlarmEditViewController::offersRow(EditorRow row) const {
+    return rules::hasRow(row, _alarm.type) && (row != EditorRow::Tone || !_isUPSMode());
+}
+
 app_assist::WGenlistItem* AlarmEditViewController::makeRow(EditorRow row) {
     switch (row) {
     case EditorRow::TimePicker:
@@ -185,15 +227,18 @@ app_assist::WGenlistItem* AlarmEditViewController::makeRow(EditorRow row) {
         return makeRepeatRow();
     case EditorRow::Type:
         return makeTypeRow();
+    case EditorRow::Volume:
+        return new AlarmVolumeItem(_alarm);
+    case EditorRow::Tone:
+        return makeToneRow();
     case EditorRow::Snooze:
-        return new AlarmSnoozeItem(_alarm);
+        return makeSnoozeRow();
     case EditorRow::IncreaseVolume:
-        return new AlarmIncreaseVolumeItem(_alarm);
+        return makeIncreaseVolumeRow();
     case EditorRow::Name:
         return new AlarmNameItem(_alarm);
-    default:
-        return nullptr;
     }
+    return nullptr;
 }
 
 app_assist::WGenlistItem* AlarmEditViewController::makeTimePickerRow() {
@@ -211,6 +256,24 @@ app_assist::WGenlistItem* AlarmEditViewController::makeRepeatRow() {
 app_assist::WGenlistItem* AlarmEditViewController::makeTypeRow() {
     auto* row = new AlarmTypeItem(_alarm);
     row->setSelectedCb([this] { showTypePopup(); });
+    return row;
+}
+
+app_assist::WGenlistItem* AlarmEditViewController::makeToneRow() {
+    auto* row = new AlarmToneItem(_alarm);
+    row->setSelectedCb([this] { _onRingToneViewSelectedCb(); });
+    return row;
+}
+
+app_assist::WGenlistItem* AlarmEditViewController::makeSnoozeRow() {
+    auto* row = new AlarmSnoozeItem(_alarm);
+    row->setSelectedCb([this] { stopPreview(); });
+    return row;
+}
+
+app_assist::WGenlistItem* AlarmEditViewController::makeIncreaseVolumeRow() {
+    auto* row = new AlarmIncreaseVolumeItem(_alarm);
+    row->setSelectedCb([this] { stopPreview(); });
     return row;
 }
 
@@ -296,16 +359,24 @@ AlarmNameItem* AlarmEditViewController::nameRow() const {
     return static_cast<AlarmNameItem*>(rowAt(EditorRow::Name));
 }
 
+AlarmVolumeItem* AlarmEditViewController::volumeRow() const {
+    return static_cast<AlarmVolumeItem*>(rowAt(EditorRow::Volume));
+}
+
 void AlarmEditViewController::_onTypePopupViewSelectedCb() {
     switch (rules::soundRowsChange(_alarm.type, presentRows(_rows))) {
     case rules::SoundRowsChange::Insert:
         for (const EditorRow row : rules::SOUND_ROWS)
-            insertRow(row);
+            if (offersRow(row))
+                insertRow(row);
         break;
     case rules::SoundRowsChange::RefreshIcon:
-        refreshRow(EditorRow::Volume);
+        if (AlarmVolumeItem* row = volumeRow())
+            row->_updateVolumeIcon(row->getSliderObj());
         break;
     case rules::SoundRowsChange::Remove:
+        if (AlarmVolumeItem* row = volumeRow())
+            row->stopSound();
         for (const EditorRow row : rules::SOUND_ROWS)
             removeRow(row);
         break;
@@ -329,10 +400,13 @@ void AlarmEditViewController::onEvent(ClockEventListener::EventType type) {
         break;
     case ClockEventListener::PAUSED:
         app_assist::WUiTimer::destroy(_minuteTimer);
+        stopPreview();
         break;
     case ClockEventListener::RESUMED:
         if (AlarmTimePickerItem* row = timePickerRow())
             row->updateDateText();
+        matchToneRowToPowerSaving();
+        endVolumeMirroring();
         armMinuteTimer();
         break;
     default:
@@ -340,7 +414,18 @@ void AlarmEditViewController::onEvent(ClockEventListener::EventType type) {
     }
 }
 
+void AlarmEditViewController::matchToneRowToPowerSaving() {
+    if (!rules::hasRow(EditorRow::Tone, _alarm.type))
+        return;
+    const bool offered = offersRow(EditorRow::Tone);
+    if (offered && !rowAt(EditorRow::Tone))
+        insertRow(EditorRow::Tone);
+    else if (!offered)
+        removeRow(EditorRow::Tone);
+}
+
 bool AlarmEditViewController::onPop() {
+    stopPreview();
     switch (_callerType) {
     case ALARM_EDIT_VIEW_CALLER_CLOCK:
         return leaveInsideClock();

@@ -1,4 +1,5 @@
-#define LOG_TAG "alarm-ui-common"
+// Under the name of the screens that ask.
+#define LOG_TAG tag
 #include "ThemePath.h"
 
 #include <cstdlib>
@@ -12,7 +13,7 @@ namespace {
 constexpr std::size_t MAX_PATH_BYTES = 4095;
 }
 
-std::string themePath(const char* resourceName) {
+std::string themePath(const char* resourceName, const char* tag) {
     char* found = nullptr;
     app_resource_manager_get(APP_RESOURCE_TYPE_IMAGE, resourceName, &found);
     const std::unique_ptr<char, decltype(&std::free)> owner(found, &std::free);

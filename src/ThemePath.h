@@ -4,5 +4,5 @@
 #include <string>
 
 // The path of a theme by its resource name ("edje/..."); empty, with a log line, when there is
-// none.
-std::string themePath(const char* resourceName);
+// none. The tag is that of the log lines.
+std::string themePath(const char* resourceName, const char* tag = "alarm-ui-common");

@@ -50,4 +50,13 @@ typedef void (*device_host_toast_cb)(const char* message, void* data);
 /** @brief Sets who shows toasts, besides their log line; null for nobody. */
 DEVICE_API void device_host_set_toast_callback(device_host_toast_cb callback, void* data);
 
+/** @brief Receives the pattern of every tap that the wearer would feel; see <device/feedback.h>. */
+typedef void (*device_host_haptic_cb)(int pattern, void* data);
+
+/** @brief Sets who shows such taps, besides their log line; null for nobody. */
+DEVICE_API void device_host_set_haptic_callback(device_host_haptic_cb callback, void* data);
+
+/** @brief 1 while a window has taken a hardware key, which the system then leaves alone; else 0. */
+DEVICE_API int device_host_key_is_grabbed(const char* key);
+
 DEVICE_EXTERN_C_END

@@ -35,4 +35,23 @@ inline constexpr const char* PART_VALUE = "value";
 /** A float: how far the value is from the middle, in values. */
 inline constexpr int MESSAGE_DISTANCE = 1;
 
+/** Class and group of edit fields, and the style of those to search with. */
+inline constexpr const char* FIELD_GROUP = "editfield";
+inline constexpr const char* STYLE_SEARCH = "search";
+inline constexpr const char* STYLE_CLEAR_BUTTON = "editfield/clear";
+
+inline constexpr const char* PART_FIELD_ENTRY = "elm.swallow.content";
+inline constexpr const char* PART_FIELD_BUTTON = "elm.swallow.button";
+
+inline constexpr const char* SIGNAL_FIELD_BUTTON_SHOW = "device,state,button,show";
+inline constexpr const char* SIGNAL_FIELD_BUTTON_HIDE = "device,state,button,hide";
+inline constexpr const char* SIGNAL_FIELD_FOCUSED = "device,state,focused";
+inline constexpr const char* SIGNAL_FIELD_UNFOCUSED = "device,state,unfocused";
+
+/** Where an index has its labels, and the text of a label. */
+inline constexpr const char* PART_INDEX_LABELS = "elm.swallow.index.0";
+inline constexpr const char* PART_INDEX_LABEL = "elm.text";
+/** A float: how far a label is moved in from the edge, as a share of its way. */
+inline constexpr int MESSAGE_INDENT = 1;
+
 } // namespace host::theme

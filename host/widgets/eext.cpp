@@ -2,12 +2,16 @@
 
 #include <algorithm>
 #include <cstring>
+#include <string>
+#include <string_view>
 #include <vector>
 
 #include <Ecore.h>
 #include <Ecore_Evas.h>
 #include <Ecore_Input.h>
 #include <Elementary.h>
+
+#include "device_host.h"
 
 #define LOG_TAG "device-host"
 #include "base/Log.h"
@@ -88,7 +92,8 @@ void listenToKeys() {
     if (handlers.released)
         return;
     handlers.pressed = ecore_event_handler_prepend(ECORE_EVENT_KEY_DOWN, keyPressed, nullptr);
-    handlers.released = ecore_event_handler_add(ECORE_EVENT_KEY_UP, keyReleased, nullptr);
+    // Before everybody else: an application may keep every key event to itself.
+    handlers.released = ecore_event_handler_prepend(ECORE_EVENT_KEY_UP, keyReleased, nullptr);
 }
 
 void dropUnusedHandlers() {
@@ -108,6 +113,39 @@ void objectDeleted(void*, Evas*, Evas_Object* object, void*) {
 bool hasListener(Evas_Object* object) {
     return std::any_of(listeners().begin(), listeners().end(),
                        [object](const Listener& l) { return l.object == object; });
+}
+
+// Hardware keys of windows. There is nothing to take from the desktop, whose own volume keys stay
+// its own: it is the simulated system that leaves a grabbed key alone.
+
+struct GrabbedKey {
+    const Evas_Object* window;
+    std::string key;
+
+    bool operator==(const GrabbedKey&) const = default;
+};
+
+std::vector<GrabbedKey>& grabbedKeys() {
+    static std::vector<GrabbedKey> keys;
+    return keys;
+}
+
+bool hasKey(const GrabbedKey& key) {
+    return std::find(grabbedKeys().begin(), grabbedKeys().end(), key) != grabbedKeys().end();
+}
+
+bool hasAnyKey(const Evas_Object* window) {
+    return std::any_of(grabbedKeys().begin(), grabbedKeys().end(),
+                       [window](const GrabbedKey& key) { return key.window == window; });
+}
+
+bool isWindow(const Evas_Object* object) {
+    const char* type = object ? evas_object_type_get(object) : nullptr;
+    return type && std::string_view(type) == "elm_win";
+}
+
+void windowDeleted(void*, Evas*, Evas_Object* window, void*) {
+    std::erase_if(grabbedKeys(), [window](const GrabbedKey& key) { return key.window == window; });
 }
 
 } // namespace
@@ -138,4 +176,36 @@ void* eext_object_event_callback_del(Evas_Object* obj, eext_event_type_e type,
         evas_object_event_callback_del_full(obj, EVAS_CALLBACK_DEL, objectDeleted, nullptr);
     dropUnusedHandlers();
     return data;
+}
+
+Eina_Bool eext_window_key_grab(Evas_Object* window, const char* key) {
+    if (!isWindow(window) || !key || !*key) {
+        LOG_ERROR("A window and the name of a key are needed");
+        return EINA_FALSE;
+    }
+    const GrabbedKey grabbed{window, key};
+    if (hasKey(grabbed))
+        return EINA_TRUE;
+    if (!hasAnyKey(window))
+        evas_object_event_callback_add(window, EVAS_CALLBACK_DEL, windowDeleted, nullptr);
+    grabbedKeys().push_back(grabbed);
+    return EINA_TRUE;
+}
+
+Eina_Bool eext_window_key_ungrab(Evas_Object* window, const char* key) {
+    if (!window || !key) {
+        LOG_ERROR("A window and the name of a key are needed");
+        return EINA_FALSE;
+    }
+    if (std::erase(grabbedKeys(), GrabbedKey{window, key}) == 0)
+        return EINA_FALSE;
+    if (!hasAnyKey(window))
+        evas_object_event_callback_del_full(window, EVAS_CALLBACK_DEL, windowDeleted, nullptr);
+    return EINA_TRUE;
+}
+
+int device_host_key_is_grabbed(const char* key) {
+    const auto& keys = grabbedKeys();
+    return key && std::any_of(keys.begin(), keys.end(),
+                              [key](const GrabbedKey& grabbed) { return grabbed.key == key; });
 }

@@ -2,6 +2,7 @@
 
 #include <Elementary.h>
 
+#include "EditField.h"
 #include "TimePicker.h"
 
 #define LOG_TAG "device-host"
@@ -31,4 +32,30 @@ Evas_Object* uxt_button_add(Evas_Object* parent, const char* style) {
     if (style && !elm_object_style_set(button, style))
         LOG_WARNING("The theme has no button style %s", style);
     return button;
+}
+
+Evas_Object* uxt_edit_field_layout_add(Evas_Object* parent, int type) {
+    if (!parent) {
+        LOG_ERROR("An edit field needs a parent");
+        return nullptr;
+    }
+    if (type != UXT_EDIT_FIELD_SEARCH) {
+        LOG_ERROR("There is no edit field of type %d", type);
+        return nullptr;
+    }
+    return host::addSearchField(parent);
+}
+
+void uxt_edit_field_set_clear_button_enabled(Evas_Object* edit_field, Eina_Bool enabled) {
+    if (host::entryOfField(edit_field))
+        host::setClearButton(edit_field, enabled != EINA_FALSE);
+    else
+        LOG_ERROR("%p is no edit field", static_cast<void*>(edit_field));
+}
+
+Evas_Object* uxt_edit_field_layout_get_entry(Evas_Object* edit_field) {
+    Evas_Object* entry = host::entryOfField(edit_field);
+    if (!entry)
+        LOG_ERROR("%p is no edit field", static_cast<void*>(edit_field));
+    return entry;
 }

@@ -31,4 +31,16 @@ DEVICE_API void ea_theme_object_color_replace(Evas_Object* obj, const char* from
  */
 DEVICE_API Evas_Object* ea_editfield_add(Evas_Object* parent, ea_editfield_type_e type);
 
+/**
+ * @brief Reads a colour of the theme.
+ * @param name Name of a colour class, for example "T1067".
+ * @param[out] r, g, b, a Colour, 0 to 255 each, not premultiplied; each may be null.
+ * @param[out] r2, g2, b2, a2 Outline colour; each may be null.
+ * @param[out] r3, g3, b3, a3 Shadow colour; each may be null.
+ * @return False when the theme has no such colour; what the pointers lead to is then untouched.
+ */
+DEVICE_API Eina_Bool ea_theme_color_get(const char* name, int* r, int* g, int* b, int* a, int* r2,
+                                        int* g2, int* b2, int* a2, int* r3, int* g3, int* b3,
+                                        int* a3);
+
 DEVICE_EXTERN_C_END

@@ -36,4 +36,17 @@ DEVICE_API void eext_object_event_callback_add(Evas_Object* obj, eext_event_type
 DEVICE_API void* eext_object_event_callback_del(Evas_Object* obj, eext_event_type_e type,
                                                 eext_event_cb callback);
 
+/**
+ * @brief Takes a hardware key from the system for as long as the window lives.
+ *
+ * A grabbed key has only its key events; the system does not act on it any more.
+ * @param window A window; not owned.
+ * @param key Key name, for example "XF86AudioRaiseVolume".
+ * @return True when the window has the key now or had it before.
+ */
+DEVICE_API Eina_Bool eext_window_key_grab(Evas_Object* window, const char* key);
+
+/** @brief Gives a key back to the system. @return False when the window did not have it. */
+DEVICE_API Eina_Bool eext_window_key_ungrab(Evas_Object* window, const char* key);
+
 DEVICE_EXTERN_C_END

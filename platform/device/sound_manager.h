@@ -33,4 +33,21 @@ DEVICE_API int sound_manager_get_volume(sound_type_e type, int* volume);
 /** @brief Sets the level of a sound type. @param volume Level, 0 to 15. */
 DEVICE_API int sound_manager_set_volume(sound_type_e type, int volume);
 
+/**
+ * @brief Called on the main loop after the level of a sound type has changed.
+ * @param volume The new level.
+ * @param data The pointer given to sound_manager_set_volume_changed_cb().
+ */
+typedef void (*sound_manager_volume_changed_cb)(sound_type_e type, unsigned int volume, void* data);
+
+/**
+ * @brief Sets who is told about changes of any sound type by any process, this one included;
+ * replaces the earlier one.
+ */
+DEVICE_API int sound_manager_set_volume_changed_cb(sound_manager_volume_changed_cb callback,
+                                                   void* data);
+
+/** @brief Tells nobody any more. Succeeds also when nobody was told. */
+DEVICE_API int sound_manager_unset_volume_changed_cb(void);
+
 DEVICE_EXTERN_C_END

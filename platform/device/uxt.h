@@ -36,4 +36,26 @@ DEVICE_API void uxt_date_time_set_format_by_locale(Evas_Object* picker, const ch
  */
 DEVICE_API Evas_Object* uxt_button_add(Evas_Object* parent, const char* style);
 
+/** Kinds of edit fields of uxt_edit_field_layout_add(). */
+typedef enum {
+    UXT_EDIT_FIELD_SEARCH = 5, /**< One line to search with. */
+} uxt_edit_field_type_e;
+
+/**
+ * @brief Adds an edit field: an entry with a ground of its own and room for a clear button.
+ * @param type One of #uxt_edit_field_type_e.
+ * @return A layout, owned by its parent, or null on failure.
+ */
+DEVICE_API Evas_Object* uxt_edit_field_layout_add(Evas_Object* parent, int type);
+
+/**
+ * @brief Shows a button that empties the entry while there is text in it, or does not.
+ *
+ * The button keeps the entry focused.
+ */
+DEVICE_API void uxt_edit_field_set_clear_button_enabled(Evas_Object* edit_field, Eina_Bool enabled);
+
+/** @brief The entry of an edit field; owned by it. Null when it is none. */
+DEVICE_API Evas_Object* uxt_edit_field_layout_get_entry(Evas_Object* edit_field);
+
 DEVICE_EXTERN_C_END

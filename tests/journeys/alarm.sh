@@ -3,29 +3,11 @@
 # An alarm's life, from the first tap to the database, by pointer and keys alone.
 # shellcheck disable=SC2086 # a place of watch.sh is two words: x and y
 set -u
-here=$(cd "$(dirname "${BASH_SOURCE[0]}")" && pwd) || exit 1
-. "$here/check.sh"
-. "$here/../../scripts/watch.sh"
-simulator=$1 pictures=$2
-check_environment
-export TZ=Europe/Berlin
-trap 'watch_end; rm -rf "$work"' EXIT
-rm -rf "$pictures" && mkdir -p "$pictures" || exit 1
-database=$work/data/clock.db log=$pictures/clock-sim.log
+. "$(dirname "${BASH_SOURCE[0]}")/journey.sh" "$@"
 
-ask() { sqlite3 -readonly "$database" "$1"; }
-column() { ask "SELECT $1 FROM alarm"; }
-stored() { ask 'SELECT * FROM alarm'; }
-alarms_are() { [ "$(ask 'SELECT count(*) FROM alarm' 2>/dev/null)" = "$1" ]; }
 minute_is() { [ "$(column min)" = "$1" ]; }
-toasts_are() { [ "$(grep -ac 'Toast: ' "$log")" = "$1" ]; }
-starts() { watch_start "$log" "$simulator" --data "$work/data" --24h "$@"; }
 ends() { watch_wait 10 bash -c '! kill -0 '"$watch_pid" && watch_exit; }
 watch_exit() { wait "$watch_pid"; }
-picture() { watch_picture "$pictures/$1.png"; }
-# The picture shows something else than another one.
-differs() { ! is "$(pixels "$1")" "$(pixels "$2")" >/dev/null; }
-pixels() { convert "$pictures/$1.png" rgb:- | cksum; }
 
 check "A display starts" watch_display "$work" || exit 1
 check "The watch starts" starts
@@ -124,5 +106,5 @@ check "The end of a session ends it well" watch_stop
 check "The watch starts once more" starts
 kill -KILL "$watch_pid" && wait "$watch_pid" 2>/dev/null
 check "A killed watch loses nothing" is "$(stored)" "$second"
-check "No error was logged" test -z "$(grep -a Critical "$log" | grep -avE "$CHECK_USUAL_ERRORS" | tee -a /dev/stderr)"
+check "No error was logged" no_error_is_logged
 check_end

@@ -21,7 +21,7 @@ runs() {
 says_one_line() { is "$(grep -ac '^clock-sim: ' "$work/err")" 1 && contains "$(grep -a '^clock-sim: ' "$work/err")" "$1"; }
 
 check "--help ends well" runs 0 --help
-for word in --data --resources --language --12h --24h --create --edit --version Escape F5 F6 F7 F8 F9 "Exit status"; do
+for word in --data --resources --language --12h --24h --create --edit --set-volume --power-saving --version Escape F2 F3 F4 F5 F6 F7 F8 F9 F10 "Exit status"; do
     check "--help tells about $word" contains "$out" "$word"
 done
 check "--help is quiet on the error stream" is "$err" ""
@@ -46,6 +46,11 @@ check "A value for an option without one is refused" runs 2 --24h=yes
 check "The option without a value is named" says_one_line "'--24h' takes no value"
 check "--create and --edit together are refused" runs 2 --create --edit 1
 check "The two options are named" says_one_line "exclude each other"
+check "A volume above the loudest is refused" runs 2 --set-volume 16
+check "A level is asked for" says_one_line "needs a level from 0 to 15"
+check "Power saving is on or off" runs 2 --power-saving 2
+check "The two words are named" says_one_line "needs 'on' or 'off'"
+check "A watch that only sets opens no editor" runs 2 --set-volume 3 --create
 check "The first mistake counts, --help or not" runs 2 --loud --help
 
 mkdir "$work/file-in-the-way.d" && : >"$work/file-in-the-way"
@@ -68,4 +73,17 @@ check "The alarm is named" says_one_line "alarm 4711 is not stored"
 
 check "The 12-hour form is written into the settings" runs 1 --data "$work/data" --12h
 check "The setting is there" grep -rqs 1 "$work/data" --include='*regionformat_time1224*'
+
+# Without a display: what is set is for a watch that runs elsewhere.
+setting() { cat "$work/data/settings/db%2F$1"; }
+check "The volume is set and the simulator ends well" runs 0 --data "$work/data" --set-volume 0
+check "The volume is there" is "$(setting private%2Fsound%2Fvolume%2Falarm)" "int 0"
+check "Power saving is switched on, at another volume" runs 0 --data "$work/data" --power-saving on --set-volume=15
+check "Power saving is on" is "$(setting setting%2Fpsmode)" "int 2"
+check "The other volume is there" is "$(setting private%2Fsound%2Fvolume%2Falarm)" "int 15"
+check "Power saving is switched off" runs 0 --data "$work/data" --power-saving off
+check "Power saving is off" is "$(setting setting%2Fpsmode)" "int 0"
+chmod a-w "$work/data/settings"
+[ "$(id -u)" = 0 ] || check "A setting that cannot be written is told about" runs 1 --data "$work/data" --set-volume 3
+chmod u+w "$work/data/settings"
 check_end

@@ -3,27 +3,10 @@
 # An alarm for the working days becomes one for a day of its own, by pointer and keys alone.
 # shellcheck disable=SC2086 # a place of watch.sh is two words: x and y
 set -u
-here=$(cd "$(dirname "${BASH_SOURCE[0]}")" && pwd) || exit 1
-. "$here/check.sh"
-. "$here/../../scripts/watch.sh"
-simulator=$1 pictures=$2
-check_environment
-export TZ=Europe/Berlin
-trap 'watch_end; rm -rf "$work"' EXIT
-rm -rf "$pictures" && mkdir -p "$pictures" || exit 1
-database=$work/data/clock.db log=$pictures/clock-sim.log
+. "$(dirname "${BASH_SOURCE[0]}")/journey.sh" "$@"
 
-ask() { sqlite3 -readonly "$database" "$1"; }
-column() { ask "SELECT $1 FROM alarm"; }
 schedule() { ask "SELECT $1 FROM alarm_schedule JOIN alarm ON alarm_mgr_id = schedule_id"; }
-alarms_are() { [ "$(ask 'SELECT count(*) FROM alarm' 2>/dev/null)" = "$1" ]; }
 repeat_is() { [ "$(column repeat_weekly)" = "$1" ]; }
-toasts_are() { [ "$(grep -ac 'Toast: ' "$log")" = "$1" ]; }
-picture() { watch_picture "$pictures/$1.png"; }
-# What lies below the title: that of a new alarm reads otherwise than that of a stored one.
-below_title() { convert "$pictures/$1.png" -crop 360x275+0+85 rgb:- | cksum; }
-looks_like() { is "$(below_title "$1")" "$(below_title "$2")"; }
-differs() { ! looks_like "$1" "$2" >/dev/null; }
 # look_through NAME: pictures of the whole editor, from its first row to its last.
 look_through() {
     picture "$1-top"
@@ -37,10 +20,9 @@ looks_through_like() {
     done
 }
 toast_is_gone() { [ "$(watch_look)" != "$toast" ]; }
-to_top() { watch_until_still watch_scroll_back; }
 
 check "A display starts" watch_display "$work" || exit 1
-check "The watch starts" watch_start "$log" "$simulator" --data "$work/data" --24h
+check "The watch starts" starts
 
 # Monday to Friday.
 check "Create is tapped" watch_tap $WATCH_CREATE
@@ -150,5 +132,5 @@ check "The rest is as it was" is "$(column 'hour, min, type, snooze')" '7|3|2|0'
 check "It rings on that day" is "$(schedule "printf('%04d-%02d-%02d', year, month, day)")" "$day"
 check "A second toast came" watch_wait 10 toasts_are 2
 check "The watch ends well" watch_stop
-check "No error was logged" test -z "$(grep -a Critical "$log" | grep -avE "$CHECK_USUAL_ERRORS" | tee -a /dev/stderr)"
+check "No error was logged" no_error_is_logged
 check_end

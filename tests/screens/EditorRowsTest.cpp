@@ -1,5 +1,6 @@
 // The editor's rows together: their order, and what they do to the editor and to each other.
 
+#include <algorithm>
 #include <string>
 #include <vector>
 
@@ -9,7 +10,9 @@
 #include "AlarmIncreaseVolumeItem.h"
 #include "AlarmRepeatItem.h"
 #include "AlarmSnoozeItem.h"
+#include "AlarmToneItem.h"
 #include "AlarmTypeItem.h"
+#include "AlarmVolumeItem.h"
 #include "screens/EditorFixture.h"
 #include "screens/TestCatalogue.h"
 #include "support/LiveObjects.h"
@@ -21,7 +24,7 @@ using testing::IsEmpty;
 namespace {
 
 const std::vector<std::string> SILENT_ROWS = {"time", "repeat", "type", "snooze", "name"};
-const std::vector<std::string> SOUND_ROWS = {"time",   "repeat",          "type",
+const std::vector<std::string> SOUND_ROWS = {"time",   "repeat",          "type", "volume", "tone",
                                              "snooze", "increase volume", "name"};
 
 class EditorRowsTest : public EditorFixture {
@@ -44,22 +47,23 @@ protected:
             return "repeat";
         if (dynamic_cast<AlarmTypeItem*>(row))
             return "type";
+        if (dynamic_cast<AlarmVolumeItem*>(row))
+            return "volume";
+        if (dynamic_cast<AlarmToneItem*>(row))
+            return "tone";
         if (dynamic_cast<AlarmSnoozeItem*>(row))
             return "snooze";
         if (dynamic_cast<AlarmIncreaseVolumeItem*>(row))
             return "increase volume";
-        return dynamic_cast<AlarmNameItem*>(row) ? "name" : "";
+        return dynamic_cast<AlarmNameItem*>(row) ? "name" : "unknown";
     }
 
-    /** The rows from the top, those without a kind left out. */
+    /** The rows from the top. */
     std::vector<std::string> kinds() {
         std::vector<std::string> kinds;
-        for (const Row& shown : Stage::rows(genlist())) {
-            const std::string kind = kindOf(
-                static_cast<app_assist::WGenlistItem*>(elm_object_item_data_get(shown.item)));
-            if (!kind.empty())
-                kinds.push_back(kind);
-        }
+        for (const Row& shown : Stage::rows(genlist()))
+            kinds.push_back(kindOf(
+                static_cast<app_assist::WGenlistItem*>(elm_object_item_data_get(shown.item))));
         return kinds;
     }
 
@@ -117,6 +121,18 @@ TEST_F(EditorRowsTest, AnAlarmWithSoundHasItsRowsInOrder) {
         EXPECT_EQ(kinds(), SOUND_ROWS);
         EXPECT_THAT(errorLines(), IsEmpty());
     }
+}
+
+TEST_F(EditorRowsTest, InUltraPowerSavingThereIsNoTone) {
+    std::vector<std::string> rows = SOUND_ROWS;
+    rows.erase(std::find(rows.begin(), rows.end(), "tone"));
+    device().setSetting("db/setting/psmode", 2);
+    createAlarm();
+    EXPECT_EQ(kinds(), rows);
+    chooseType("Vibration");
+    EXPECT_EQ(kinds(), SILENT_ROWS);
+    chooseType("Sound");
+    EXPECT_EQ(kinds(), rows);
 }
 
 TEST_F(EditorRowsTest, AVibratingAlarmHasFiveRows) {

@@ -17,6 +17,7 @@ using namespace host::theme;
 const std::string DEVICE = "device.edj";
 const std::string ROWS = "AlarmCustomTheme.edj";
 const std::string EDITOR = "AlarmEditViewController.edj";
+const std::string CITIES = "WorldClockAddCityViewController.edj";
 
 std::string pathOf(const std::string& file) {
     return std::string(CLOCK_RESOURCE_DIR "/edje/") + file;
@@ -54,6 +55,9 @@ const std::vector<Contract>& contracts() {
          "elm/genlist/item_compress/edit.theme.time/default",
          {"timepicker.area", "calendar.area"}},
         {EDITOR, "edit.layout.calendar", {"date.text", "date.button"}},
+        {EDITOR, "volume.normal.bg", {"icon"}},
+        {EDITOR, "volume.vibrate.bg", {"icon"}},
+        {EDITOR, "volume.mute.bg", {"icon"}},
         {DEVICE,
          "elm/naviframe/item/basic/default",
          {"title_left_btn", "title_right_btn", "more_btn", "elm.text.title", "elm.swallow.prev_btn",
@@ -70,7 +74,27 @@ const std::vector<Contract>& contracts() {
         {DEVICE,
          "elm/popup/buttons2/popup/default",
          {"elm.swallow.content.button1", "elm.swallow.content.button2"}},
+        {CITIES, "searchbar.layout", {"entry.part", "location.btn"}},
+        {DEVICE, "elm/layout/application/default", {"elm.swallow.content"}},
+        {DEVICE, "elm/layout/application/searchbar_base", {"searchbar", "elm.swallow.content"}},
+        {DEVICE,
+         "elm/layout/application/fastscroll",
+         {"elm.swallow.fastscroll", "elm.swallow.content"}},
+        {DEVICE, "elm/layout/nocontents/search", {"elm.text"}},
+        {DEVICE,
+         std::string("elm/") + LAYOUT_CLASS + "/" + FIELD_GROUP + "/" + STYLE_SEARCH,
+         {PART_FIELD_ENTRY, PART_FIELD_BUTTON, "ring"}},
+        {DEVICE, std::string("elm/button/base/") + STYLE_CLEAR_BUTTON, {"cross"}},
+        {DEVICE, "elm/button/base/bg_animated", {"location"}},
+        {DEVICE,
+         "elm/index/base/vertical/default",
+         {PART_INDEX_LABELS, "elm.swallow.event.0", "bubble", "elm.text"}},
+        {DEVICE, "elm/index/item/vertical/default", {PART_INDEX_LABEL}},
         {DEVICE, "elm/check/base/on&off", {"track", "knob"}},
+        {DEVICE,
+         "elm/slider/horizontal/default",
+         {"elm.swallow.icon", "elm.swallow.bar", "elm.dragable.slider", "hold", "track", "level",
+          "knob"}},
         {DEVICE, "elm/check/base/default", {"mark", "ring", "fill", "tick", "event"}},
         {DEVICE, "elm/radio/base/list", {"mark", "ring", "fill", "event"}},
         {DEVICE, "elm/layout/list/C/type.2/default", {"elm.swallow.content"}},
@@ -124,8 +148,13 @@ TEST_F(ThemeContractTest, EveryGroupAndPartThatCodeNamesExists) {
     }
 }
 
+TEST_F(ThemeContractTest, ASliderOpensNoWindowForItsValue) {
+    Evas_Object* edje = open(DEVICE, "elm/slider/horizontal/default");
+    EXPECT_FALSE(edje_object_part_exists(edje, "elm.track.slider"));
+}
+
 TEST_F(ThemeContractTest, EveryGroupOfEveryThemeOpens) {
-    for (const std::string& file : {DEVICE, ROWS, EDITOR}) {
+    for (const std::string& file : {DEVICE, ROWS, EDITOR, CITIES}) {
         const auto groups = groupsOf(file);
         EXPECT_FALSE(groups.empty()) << file;
         for (const std::string& group : groups) {
@@ -180,7 +209,7 @@ TEST_F(ThemeContractTest, TheContractIsWrittenForEveryGroup) {
 
 TEST_F(ThemeContractTest, TheColoursThatCodeNamesAreInTheTheme) {
     Evas_Object* edje = open(DEVICE, "elm/button/base/default");
-    for (const char* name : {"accent", "warning", "ground", "text", "B0211"}) {
+    for (const char* name : {"accent", "warning", "ground", "text", "B0211", "T1067"}) {
         int r = -1;
         int g = -1;
         int b = -1;

@@ -1,12 +1,9 @@
-// Toasts on the face, and the keys that stand for a device's events.
+// Toasts on the face.
 
 #include "ToastView.h"
 
 #include <string>
-#include <vector>
 
-#include "Keys.h"
-#include "clock/ClockEventListener.h"
 #include "support/ScreenTest.h"
 
 using simulator::ToastView;
@@ -18,12 +15,6 @@ const std::string THEME = CLOCK_RESOURCE_DIR "/edje/simulator.edj";
 class ToastViewTest : public ScreenTest {
 protected:
     bool shows(const std::string& text) { return stage().shows(text); }
-};
-
-class EventRecorder : public ClockEventListener {
-public:
-    void onEvent(EventType type) override { events.push_back(type); }
-    std::vector<EventType> events;
 };
 
 } // namespace
@@ -93,19 +84,4 @@ TEST_F(ToastViewTest, aViewThatGoesWithAToastLeavesNothingBehind) {
 TEST_F(ToastViewTest, aThemeWithoutAToastIsLogged) {
     const ToastView toasts(stage().window(), "/nowhere.edj");
     expectLog("'/nowhere.edj' has no toast");
-}
-
-TEST_F(ToastViewTest, functionKeysRaiseTheApplicationsEvents) {
-    stage();
-    EventRecorder recorder;
-    {
-        const simulator::Keys keys;
-        for (const char* key : {"F5", "F6", "F7", "F8", "F9", "F10", "a"})
-            stage().key(key);
-    }
-    stage().key("F5");
-    EXPECT_EQ(recorder.events,
-              (std::vector{ClockEventListener::PAUSED, ClockEventListener::RESUMED,
-                           ClockEventListener::LANGUAGE_CHANGED, ClockEventListener::TIME_CHANGED,
-                           ClockEventListener::SETTINGS_CHANGED}));
 }

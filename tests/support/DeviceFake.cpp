@@ -18,6 +18,10 @@
 #include "device/eext.h"
 #include "device/notification.h"
 #include "device/uxt.h"
+#include "support/AppControlFake.h"
+#include "support/CityDeviceFake.h"
+#include "support/SoundFake.h"
+#include "support/ToneFake.h"
 
 struct keynode_s {
     const char* name;
@@ -202,6 +206,10 @@ void DeviceFake::reset() {
     removeTemporaryFolder();
     _log.clear();
     _errorsTaken = 0;
+    applications::reset();
+    cityDevice().reset();
+    soundDevice().reset();
+    tones::reset();
 }
 
 std::optional<int> DeviceFake::record(const std::string& function, const std::string& arguments) {

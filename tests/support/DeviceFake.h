@@ -74,6 +74,8 @@ public:
     void failOnce(const std::string& function, int result = -1);
     /** Takes back fail() and failOnce(). */
     void succeed(const std::string& function) { _failures.erase(function); }
+    /** Notes a call, for the fakes in other files. @return What it was told to fail with, if so. */
+    std::optional<int> record(const std::string& function, const std::string& arguments);
 
     // Settings.
 
@@ -151,7 +153,6 @@ private:
     };
 
     DeviceFake();
-    std::optional<int> record(const std::string& function, const std::string& arguments);
     void removeTemporaryFolder();
 
     std::vector<std::string> _calls;

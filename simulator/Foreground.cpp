@@ -1,0 +1,59 @@
+#include "Foreground.h"
+
+#include <Ecore_X.h>
+#include <Elementary.h>
+
+#include "clock/ClockEventListener.h"
+
+#define LOG_TAG "clock-sim"
+#include "base/Log.h"
+
+namespace simulator {
+
+Foreground::Foreground(Evas_Object* window) : _window(window) {
+    evas_object_smart_callback_add(window, "focus,in", _focusInCb, this);
+    evas_object_smart_callback_add(window, "focus,out", _focusOutCb, this);
+    // There is no such event without an X display.
+    if (ECORE_X_EVENT_WINDOW_VISIBILITY_CHANGE != 0) {
+        _visibility.reset(
+            ecore_event_handler_add(ECORE_X_EVENT_WINDOW_VISIBILITY_CHANGE, _visibilityCb, this));
+    }
+}
+
+Foreground::~Foreground() {
+    evas_object_smart_callback_del_full(_window, "focus,in", _focusInCb, this);
+    evas_object_smart_callback_del_full(_window, "focus,out", _focusOutCb, this);
+}
+
+void Foreground::_focusInCb(void* data, Evas_Object*, void*) {
+    auto* self = static_cast<Foreground*>(data);
+    self->_unfocused = false;
+    self->update();
+}
+
+void Foreground::_focusOutCb(void* data, Evas_Object*, void*) {
+    auto* self = static_cast<Foreground*>(data);
+    self->_unfocused = true;
+    self->update();
+}
+
+Eina_Bool Foreground::_visibilityCb(void* data, int, void* info) {
+    auto* self = static_cast<Foreground*>(data);
+    const auto* event = static_cast<const Ecore_X_Event_Window_Visibility_Change*>(info);
+    if (event->win == elm_win_xwindow_get(self->_window)) {
+        self->_covered = event->fully_obscured != 0;
+        self->update();
+    }
+    return ECORE_CALLBACK_PASS_ON;
+}
+
+void Foreground::update() {
+    const bool paused = _unfocused || _covered;
+    if (paused == _paused)
+        return;
+    _paused = paused;
+    LOG_INFO("The application %s", paused ? "goes to the background" : "comes back");
+    ClockEventListener::raise(paused ? ClockEventListener::PAUSED : ClockEventListener::RESUMED);
+}
+
+} // namespace simulator

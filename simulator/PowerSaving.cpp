@@ -1,0 +1,34 @@
+#include "PowerSaving.h"
+
+#include "clock/ClockEventListener.h"
+#include "device/vconf.h"
+
+#define LOG_TAG "clock-sim"
+#include "base/Log.h"
+
+namespace simulator {
+
+namespace {
+constexpr const char* KEY = "db/setting/psmode";
+constexpr int OFF = 0;
+constexpr int ULTRA = 2;
+} // namespace
+
+bool setPowerSaving(bool on) {
+    return vconf_set_int(KEY, on ? ULTRA : OFF) == VCONF_OK;
+}
+
+void togglePowerSaving() {
+    int mode = OFF;
+    vconf_get_int(KEY, &mode);
+    const bool on = mode != ULTRA;
+    if (!setPowerSaving(on)) {
+        LOG_ERROR("Ultra power saving cannot be switched");
+        return;
+    }
+    LOG_INFO("Ultra power saving is %s", on ? "on" : "off");
+    // A person switches the mode in the settings and then comes back to the clock.
+    ClockEventListener::raise(ClockEventListener::RESUMED);
+}
+
+} // namespace simulator

@@ -1,0 +1,85 @@
+#include "QuickPanel.h"
+
+#include <utility>
+
+#include <Elementary.h>
+
+#include "VolumeView.h"
+#include "WatchFace.h"
+#include "device/eext.h"
+#include "device/sound_manager.h"
+
+#define LOG_TAG "clock-sim"
+#include "base/Log.h"
+
+namespace simulator {
+
+namespace {
+constexpr double REFRESH_SECONDS = 0.5;
+}
+
+QuickPanel::QuickPanel(Evas_Object* window, const std::string& theme,
+                       std::function<void(bool shown)> changed)
+    : _layout(elm_layout_add(window)), _changed(std::move(changed)) {
+    if (!elm_layout_file_set(_layout, theme.c_str(), "simulator/quickpanel"))
+        LOG_ERROR("'%s' has no quick panel", theme.c_str());
+    elm_object_domain_translatable_part_text_set(_layout, "panel.title", nullptr,
+                                                 "IDS_QP_HEADER_ALARM_VOLUME");
+    elm_object_domain_translatable_part_text_set(_layout, "panel.hint", nullptr,
+                                                 "IDS_QP_BODY_PRESS_THE_VOLUME_KEYS_TO_CHANGE_IT");
+    elm_object_signal_callback_add(_layout, "panel,close", "simulator", _closeCb, this);
+    evas_object_resize(_layout, FACE_SIZE, FACE_SIZE);
+    evas_object_layer_set(_layout, LAYER_SYSTEM);
+    evas_object_show(_layout);
+}
+
+QuickPanel::~QuickPanel() {
+    evas_object_del(_layout);
+}
+
+void QuickPanel::toggle() {
+    if (isShown())
+        close();
+    else
+        open();
+}
+
+void QuickPanel::open() {
+    refresh();
+    _timer.reset(ecore_timer_add(REFRESH_SECONDS, _refreshCb, this));
+    // The back key closes the panel, not what lies below it.
+    eext_object_event_callback_add(_layout, EEXT_EVENT_BACK, _backCb, this);
+    elm_object_signal_emit(_layout, "panel,show", "simulator");
+    _changed(true);
+}
+
+void QuickPanel::close() {
+    _timer.reset();
+    eext_object_event_callback_del(_layout, EEXT_EVENT_BACK, _backCb);
+    elm_object_signal_emit(_layout, "panel,hide", "simulator");
+    _changed(false);
+}
+
+void QuickPanel::refresh() {
+    int level = 0;
+    sound_manager_get_volume(SOUND_TYPE_ALARM, &level);
+    if (std::exchange(_level, level) != level)
+        setVolumeLevel(_layout, level);
+}
+
+Eina_Bool QuickPanel::_refreshCb(void* data) {
+    static_cast<QuickPanel*>(data)->refresh();
+    return ECORE_CALLBACK_RENEW;
+}
+
+void QuickPanel::_closeCb(void* data, Evas_Object*, const char*, const char*) {
+    auto* self = static_cast<QuickPanel*>(data);
+    if (self->isShown())
+        self->close();
+}
+
+void QuickPanel::_backCb(void* data, Evas_Object*, void*) {
+    static_cast<QuickPanel*>(data)->close();
+}
+
+} // namespace simulator

@@ -1,0 +1,48 @@
+// The simulator's command line.
+
+#include "Options.h"
+
+#include <string>
+#include <vector>
+
+#include <gtest/gtest.h>
+
+using simulator::Options;
+using simulator::parseOptions;
+
+TEST(SimulatorOptions, theAlarmsVolumeIsALevel) {
+    for (const int level : {0, 7, 15}) {
+        const Options options = parseOptions({"--set-volume", std::to_string(level)});
+        EXPECT_EQ(options.error, "");
+        EXPECT_EQ(options.volume, level);
+        EXPECT_TRUE(options.onlySets());
+    }
+    for (const char* value : {"16", "-1", "", "7x", "loud", "99999999999"}) {
+        EXPECT_EQ(parseOptions({"--set-volume", value}).error,
+                  "option '--set-volume' needs a level from 0 to 15")
+            << value;
+    }
+    EXPECT_NE(parseOptions({"--set-volume"}).error, "");
+}
+
+TEST(SimulatorOptions, powerSavingIsOnOrOff) {
+    EXPECT_EQ(parseOptions({"--power-saving", "on"}).powerSaving, true);
+    EXPECT_EQ(parseOptions({"--power-saving=off"}).powerSaving, false);
+    EXPECT_TRUE(parseOptions({"--power-saving=off"}).onlySets());
+    for (const char* value : {"", "2", "On", "yes"}) {
+        EXPECT_EQ(parseOptions({"--power-saving", value}).error,
+                  "option '--power-saving' needs 'on' or 'off'")
+            << value;
+    }
+}
+
+TEST(SimulatorOptions, aWatchThatOnlySetsDoesNotOpenAnEditor) {
+    EXPECT_NE(parseOptions({"--set-volume", "3", "--create"}).error, "");
+    EXPECT_NE(parseOptions({"--edit", "1", "--power-saving", "on"}).error, "");
+    EXPECT_EQ(parseOptions({"--set-volume", "3", "--power-saving", "on", "--data", "d"}).error, "");
+}
+
+TEST(SimulatorOptions, otherwiseTheWatchStarts) {
+    EXPECT_FALSE(parseOptions({}).onlySets());
+    EXPECT_FALSE(parseOptions({"--24h", "--create"}).onlySets());
+}

@@ -1,0 +1,137 @@
+// The panel that is pulled down over the face.
+
+#include "QuickPanel.h"
+
+#include <memory>
+#include <string>
+#include <vector>
+
+#include "device/eext.h"
+#include "support/ScreenTest.h"
+
+using simulator::QuickPanel;
+
+namespace {
+
+const std::string THEME = CLOCK_RESOURCE_DIR "/edje/simulator.edj";
+
+class QuickPanelTest : public ScreenTest {
+protected:
+    void SetUp() override {
+        ScreenTest::SetUp();
+        stage();
+        device().setVolume(SOUND_TYPE_ALARM, 7);
+        panel = std::make_unique<QuickPanel>(stage().window(), THEME,
+                                             [this](bool shown) { told.push_back(shown); });
+    }
+    void TearDown() override {
+        panel.reset();
+        ScreenTest::TearDown();
+    }
+    void pullDown() {
+        panel->toggle();
+        Stage::advance(0.5);
+    }
+
+    std::vector<bool> told;
+    std::unique_ptr<QuickPanel> panel;
+};
+
+} // namespace
+
+TEST_F(QuickPanelTest, itIsNotThereAtFirst) {
+    EXPECT_FALSE(panel->isShown());
+    EXPECT_FALSE(stage().shows("Alarm volume"));
+    EXPECT_TRUE(told.empty());
+}
+
+TEST_F(QuickPanelTest, itComesDownWithTheAlarmsLevelAndTells) {
+    pullDown();
+    EXPECT_TRUE(panel->isShown());
+    EXPECT_TRUE(stage().shows("Alarm volume"));
+    EXPECT_TRUE(stage().shows("7"));
+    for (const FoundText& text : stage().texts())
+        EXPECT_TRUE(text.area.insideCircle()) << text.text;
+    EXPECT_EQ(told, std::vector{true});
+}
+
+TEST_F(QuickPanelTest, itGoesUpAgainAndTells) {
+    pullDown();
+    panel->toggle();
+    EXPECT_FALSE(panel->isShown());
+    Stage::advance(0.5);
+    EXPECT_FALSE(stage().shows("Alarm volume"));
+    EXPECT_EQ(told, (std::vector{true, false}));
+}
+
+TEST_F(QuickPanelTest, aTouchSendsItUp) {
+    pullDown();
+    stage().tap(180, 260);
+    EXPECT_FALSE(panel->isShown());
+    Stage::advance(0.5);
+    EXPECT_EQ(told, (std::vector{true, false}));
+}
+
+TEST_F(QuickPanelTest, itKeepsTouchesFromWhatItCovers) {
+    Evas_Object* button = elm_button_add(stage().window());
+    evas_object_resize(button, Stage::SIZE, Stage::SIZE);
+    evas_object_show(button);
+    int clicks = 0;
+    evas_object_smart_callback_add(
+        button, "clicked", [](void* count, Evas_Object*, void*) { ++*static_cast<int*>(count); },
+        &clicks);
+    pullDown();
+    stage().tap(180, 180);
+    EXPECT_EQ(clicks, 0);
+    Stage::advance(0.5);
+    stage().tap(180, 180);
+    EXPECT_EQ(clicks, 1) << "below it once it is up";
+    evas_object_del(button);
+}
+
+TEST_F(QuickPanelTest, theBackKeySendsItUpAndNothingElse) {
+    int backs = 0;
+    eext_object_event_callback_add(
+        stage().window(), EEXT_EVENT_BACK,
+        [](void* count, Evas_Object*, void*) { ++*static_cast<int*>(count); }, &backs);
+    pullDown();
+    stage().backKey();
+    EXPECT_FALSE(panel->isShown());
+    EXPECT_EQ(backs, 0);
+    Stage::advance(0.5);
+    stage().backKey();
+    EXPECT_EQ(backs, 1);
+    EXPECT_EQ(told, (std::vector{true, false}));
+}
+
+TEST_F(QuickPanelTest, itFollowsALevelThatChangesMeanwhile) {
+    pullDown();
+    device().setVolume(SOUND_TYPE_ALARM, 3);
+    panel->refresh();
+    Stage::frames(2);
+    EXPECT_TRUE(stage().shows("3"));
+    device().setVolume(SOUND_TYPE_ALARM, 12);
+    Stage::advance(0.7);
+    EXPECT_TRUE(stage().shows("12")) << "another process set it";
+}
+
+TEST_F(QuickPanelTest, itReadsTheLevelAnewEachTime) {
+    pullDown();
+    panel->toggle();
+    device().setVolume(SOUND_TYPE_ALARM, 2);
+    pullDown();
+    EXPECT_TRUE(stage().shows("2"));
+}
+
+TEST_F(QuickPanelTest, aPanelThatGoesWhileItIsDownLeavesNothingBehind) {
+    pullDown();
+    panel.reset();
+    Stage::advance(1);
+    stage().backKey();
+    EXPECT_FALSE(stage().shows("Alarm volume"));
+}
+
+TEST_F(QuickPanelTest, aThemeWithoutAPanelIsLogged) {
+    const QuickPanel other(stage().window(), "/nowhere.edj", [](bool) {});
+    expectLog("'/nowhere.edj' has no quick panel");
+}
