@@ -2,14 +2,12 @@
 #include "clock/ClockIcuDataModel.h"
 
 #include <algorithm>
-#include <clocale>
 #include <cstdlib>
 #include <cstring>
 #include <map>
 #include <memory>
 #include <set>
 #include <string>
-#include <string_view>
 #include <unicode/calendar.h>
 #include <unicode/dtptngen.h>
 #include <unicode/simpletz.h>
@@ -17,6 +15,7 @@
 
 #include <base/CivilTime.h>
 #include <base/Log.h>
+#include <base/MessageLocale.h>
 #include <base/Text.h>
 
 namespace {
@@ -25,53 +24,6 @@ namespace {
 constexpr std::size_t MOST_FORMATS = 64;
 
 using FormatKey = std::pair<std::string, std::string>;
-
-bool isUntranslated(std::string_view locale) {
-    return locale.empty() || locale == "C" || locale == "POSIX" || locale.starts_with("C.");
-}
-
-/** The entry of LANGUAGE that is asked first; empty when it names none. */
-std::string preferredLanguage() {
-    const char* list = std::getenv("LANGUAGE");
-    std::string_view rest = list ? list : "";
-    while (rest.starts_with(':'))
-        rest.remove_prefix(1);
-    return std::string(rest.substr(0, rest.find(':')));
-}
-
-std::string_view languageOf(std::string_view locale) {
-    return locale.substr(0, locale.find_first_of("_.@"));
-}
-
-/** The name of the locale in which gettext looks for texts. */
-std::string messageLocale() {
-    const char* name = std::setlocale(LC_MESSAGES, nullptr);
-    std::string locale = name ? name : "C";
-    // As gettext does: the plain "C" locale turns translation off altogether.
-    if (locale == "C" || locale == "POSIX")
-        return locale;
-    auto preferred = preferredLanguage();
-    // "en" asks for the texts; the locale then still knows the country.
-    if (preferred.empty() ||
-        (preferred == languageOf(preferred) && preferred == languageOf(locale)))
-        return locale;
-    return preferred;
-}
-
-/** "sr_RS.UTF-8@latin" becomes "sr_Latn_RS". */
-std::string icuLocale(std::string_view name) {
-    if (isUntranslated(name))
-        return "en";
-    const auto at = name.find('@');
-    const auto modifier = at == std::string_view::npos ? std::string_view() : name.substr(at + 1);
-    const auto plain = name.substr(0, name.find_first_of(".@"));
-    std::string locale(languageOf(plain));
-    if (modifier == "latin")
-        locale += "_Latn";
-    else if (modifier == "cyrillic")
-        locale += "_Cyrl";
-    return locale + std::string(plain.substr(languageOf(plain).size()));
-}
 
 /** The format of a skeleton in a locale; null when ICU refuses. */
 icu::SimpleDateFormat* findFormat(const std::string& locale, const std::string& skeleton) {
@@ -181,5 +133,5 @@ int ClockIcuDataModel::getFirstDayOfWeek() {
 const char* ClockIcuDataModel::getCurrentLocale() {
     // Every name stays valid: callers keep the pointer across a change of language.
     static std::set<std::string> names;
-    return names.insert(icuLocale(messageLocale())).first->c_str();
+    return names.insert(base::messageLocale()).first->c_str();
 }
