@@ -31,7 +31,7 @@ const std::vector<Layer> layers{
     {"platform/app_assist", {"platform/base", "platform/device"}},
     {"platform/clock", {"platform/base", "platform/device"}},
     {"include", {"platform/app_assist", "platform/clock", "platform/device"}},
-    {"src/rules", {"platform/base", "platform/clock"}},
+    {"src/rules", {"platform/base", "platform/clock", "platform/device"}},
     {"src",
      {"include", "src/rules", "platform/app_assist", "platform/clock", "platform/base",
       "platform/device"}},
