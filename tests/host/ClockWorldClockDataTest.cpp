@@ -6,7 +6,6 @@
 #include <iterator>
 #include <libintl.h>
 #include <map>
-#include <regex>
 #include <set>
 #include <sstream>
 #include <string>
@@ -161,17 +160,17 @@ TEST_F(ClockWorldClockDataTest, CitiesOfOneNameShowTheirState) {
 }
 
 TEST_F(ClockWorldClockDataTest, EveryRecordIsInTheFormThatScreensAndOtherApplicationsExpect) {
-    const std::regex id("IDS_[A-Z0-9_]+");
-    const std::regex codes("([0-9]{3}( [0-9]{3})*)?");
-    const std::regex offset("GMT[+-][0-9]{2}:[0-9]{2}");
+    const auto id = testing::MatchesRegex("IDS_[A-Z0-9_]+");
+    const auto codes = testing::MatchesRegex("([0-9]{3}( [0-9]{3})*)?");
+    const auto offset = testing::MatchesRegex("GMT[+-][0-9]{2}:[0-9]{2}");
     std::set<int> keys;
     std::set<std::string> ids;
     for (const auto& city : cities()) {
-        EXPECT_TRUE(std::regex_match(city.city, id)) << city.city;
-        EXPECT_TRUE(std::regex_match(city.country, id)) << city.country;
+        EXPECT_THAT(city.city, id) << city.city;
+        EXPECT_THAT(city.country, id) << city.country;
         EXPECT_LE(std::max({city.city.size(), city.country.size(), city.tzPath.size()}), 63U);
-        EXPECT_TRUE(std::regex_match(city.mcc, codes)) << city.mcc;
-        EXPECT_TRUE(std::regex_match(city.timezone, offset)) << city.timezone;
+        EXPECT_THAT(city.mcc, codes) << city.mcc;
+        EXPECT_THAT(city.timezone, offset) << city.timezone;
         EXPECT_TRUE(fs::is_regular_file("/usr/share/zoneinfo/" + city.tzPath)) << city.tzPath;
         EXPECT_TRUE(keys.insert(city.index).second) << city.index;
         EXPECT_TRUE(ids.insert(city.city).second) << city.city;

@@ -54,6 +54,13 @@ TEST_F(PictureTest, AnAlarmWithADate) {
     stage().expectPicture("editor-date");
 }
 
+TEST_F(PictureTest, TheVolumeInTheMiddle) {
+    editAlarm(morning());
+    stage().showRow(elm_genlist_nth_item_get(genlist(), 3));
+    stage().settle();
+    stage().expectPicture("editor-volume");
+}
+
 TEST_F(PictureTest, TheNameInTheMiddle) {
     editAlarm(morning());
     stage().showRow(nameRow().getElmObjectItem());
