@@ -3,16 +3,15 @@
 #define LOG_TAG "device-host"
 #include <device/alarm_server.h>
 
-#include <cstdlib>
 #include <ctime>
 #include <optional>
 #include <string>
 #include <vector>
 
+#include <base/AppStore.h>
 #include <base/CivilTime.h>
 #include <base/Log.h>
 #include <base/SqliteDatabase.h>
-#include <device/app_common.h>
 
 namespace {
 
@@ -41,17 +40,11 @@ const std::vector<std::string>& migrations() {
 }
 
 std::string storePath() {
-    char* folder = app_get_data_path();
-    std::string path = folder ? std::string(folder) + "clock.db" : std::string();
-    std::free(folder);
-    return path;
+    return base::appDataPath("clock.db", LOG_TAG);
 }
 
 bool openStore(base::SqliteDatabase& database) {
-    const bool opened = database.open("alarm-server", migrations());
-    if (!database.quarantinePath().empty())
-        LOG_ERROR("%s was damaged, it is kept as %s", database.path().c_str(),
-                  database.quarantinePath().c_str());
+    const bool opened = base::openAppStore(database, "alarm-server", migrations(), LOG_TAG);
     if (!opened)
         LOG_ERROR("schedules cannot be opened: %s", database.lastError().c_str());
     return opened;

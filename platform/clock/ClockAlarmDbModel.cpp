@@ -2,15 +2,14 @@
 #include "clock/ClockAlarmDbModel.h"
 
 #include <array>
-#include <cstdlib>
 #include <ctime>
 #include <limits>
 #include <optional>
 #include <string>
 
+#include <base/AppStore.h>
 #include <base/Log.h>
 #include <base/SqliteDatabase.h>
-#include <device/app_common.h>
 
 #include "clock/AlarmRing.h"
 
@@ -117,17 +116,6 @@ void announceChange() {
         changed();
 }
 
-std::string storePath() {
-    char* folder = app_get_data_path();
-    if (!folder) {
-        LOG_ERROR("app_get_data_path() is NULL !!");
-        return {};
-    }
-    std::string path = std::string(folder) + "clock.db";
-    std::free(folder);
-    return path;
-}
-
 /** The smallest id that is not taken and was never handed out; nothing when there is none. */
 std::optional<std::int32_t> takeNextId(base::SqliteDatabase& database) {
     auto query = database.prepare("SELECT MAX(next, IFNULL((SELECT MAX(id) + 1 FROM alarm), 1)) "
@@ -165,11 +153,8 @@ bool writeNewAlarm(base::SqliteDatabase& database, ClockAlarmDbData alarm) {
 } // namespace
 
 ClockAlarmDbModel::ClockAlarmDbModel()
-    : _database(std::make_unique<base::SqliteDatabase>(storePath())) {
-    _database->open(OWNER, migrations());
-    if (!_database->quarantinePath().empty())
-        LOG_ERROR("%s was damaged, it is kept as %s", _database->path().c_str(),
-                  _database->quarantinePath().c_str());
+    : _database(std::make_unique<base::SqliteDatabase>(base::appDataPath("clock.db", LOG_TAG))) {
+    base::openAppStore(*_database, OWNER, migrations(), LOG_TAG);
 }
 
 ClockAlarmDbModel::~ClockAlarmDbModel() = default;

@@ -2,15 +2,14 @@
 #include "clock/ClockWorldClockDbModel.h"
 
 #include <algorithm>
-#include <cstdlib>
 #include <limits>
 #include <optional>
 #include <string>
 #include <unordered_map>
 
+#include <base/AppStore.h>
 #include <base/Log.h>
 #include <base/SqliteDatabase.h>
-#include <device/app_common.h>
 
 #include "clock/CityDatabase.h"
 
@@ -34,17 +33,6 @@ struct Choice {
     std::int32_t position = 0;
     std::string city;
 };
-
-std::string storePath() {
-    char* folder = app_get_data_path();
-    if (!folder) {
-        LOG_ERROR("app_get_data_path() is NULL !!");
-        return {};
-    }
-    std::string path = std::string(folder) + "world-clock-selection.db";
-    std::free(folder);
-    return path;
-}
 
 /** The user's choice in its order; nothing when it cannot be read. */
 std::optional<std::vector<Choice>> readChoice(base::SqliteDatabase& selection) {
@@ -95,11 +83,9 @@ bool deleteChoice(base::SqliteDatabase& selection, std::int32_t key) {
 } // namespace
 
 ClockWorldClockDbModel::ClockWorldClockDbModel()
-    : _selection(std::make_unique<base::SqliteDatabase>(storePath())) {
-    _selection->open(OWNER, migrations());
-    if (!_selection->quarantinePath().empty())
-        LOG_ERROR("%s was damaged, it is kept as %s", _selection->path().c_str(),
-                  _selection->quarantinePath().c_str());
+    : _selection(std::make_unique<base::SqliteDatabase>(
+          base::appDataPath("world-clock-selection.db", LOG_TAG))) {
+    base::openAppStore(*_selection, OWNER, migrations(), LOG_TAG);
 }
 
 ClockWorldClockDbModel::~ClockWorldClockDbModel() = default;

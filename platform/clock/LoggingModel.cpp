@@ -1,14 +1,13 @@
 #define LOG_TAG "clock-common"
 #include "clock/LoggingModel.h"
 
-#include <cstdlib>
 #include <ctime>
 #include <string>
 #include <vector>
 
+#include <base/AppStore.h>
 #include <base/Log.h>
 #include <base/SqliteDatabase.h>
-#include <device/app_common.h>
 
 namespace {
 
@@ -28,27 +27,12 @@ const std::vector<std::string>& migrations() {
 }
 
 bool openStore(base::SqliteDatabase& database) {
-    const bool opened = database.open("usage", migrations());
-    if (!database.quarantinePath().empty())
-        LOG_ERROR("%s was damaged, it is kept as %s", database.path().c_str(),
-                  database.quarantinePath().c_str());
-    if (!opened) {
+    if (!base::openAppStore(database, "usage", migrations(), LOG_TAG)) {
         LOG_ERROR("usage log cannot be opened: %s", database.lastError().c_str());
         return false;
     }
     // The editor logs several events at once while a person waits for it to close.
     return database.relax();
-}
-
-std::string storePath() {
-    char* folder = app_get_data_path();
-    if (!folder) {
-        LOG_ERROR("app_get_data_path() is NULL !!");
-        return {};
-    }
-    std::string path = std::string(folder) + FILE_NAME;
-    std::free(folder);
-    return path;
 }
 
 bool writeEvent(base::SqliteDatabase& database, const char* applicationId, const char* feature,
@@ -75,7 +59,7 @@ LoggingModel& LoggingModel::getInstance() {
 
 void LoggingModel::init() {
     // Opening makes the file and its table.
-    base::SqliteDatabase database(storePath());
+    base::SqliteDatabase database(base::appDataPath(FILE_NAME, LOG_TAG));
     openStore(database);
 }
 
@@ -87,7 +71,7 @@ void LoggingModel::insertLog(const char* applicationId, const char* feature, con
                                                   : "detail");
         return;
     }
-    base::SqliteDatabase database(storePath());
+    base::SqliteDatabase database(base::appDataPath(FILE_NAME, LOG_TAG));
     if (openStore(database) && !database.transaction([&] {
             return writeEvent(database, applicationId, feature, detail, extra);
         }))

@@ -5,6 +5,7 @@
 #include <memory>
 
 #include "support/DeviceFake.h"
+#include "support/FakeCalls.h"
 
 struct app_control_s {
     std::string name;
@@ -13,6 +14,8 @@ struct app_control_s {
 };
 
 namespace {
+
+using fakes::quoted;
 
 struct State {
     std::vector<std::unique_ptr<app_control_s>> made;
@@ -26,10 +29,6 @@ State& state() {
     // Never destroyed, like the device.
     static State* state = new State;
     return *state;
-}
-
-std::string quoted(const char* text) {
-    return text ? '"' + std::string(text) + '"' : std::string("null");
 }
 
 bool lives(const app_control_s* wanted) {

@@ -1,11 +1,9 @@
 #include "support/CityDeviceFake.h"
 
 #include <algorithm>
-#include <cstdio>
 #include <cstdlib>
 #include <cstring>
 
-#include <dlfcn.h>
 #include <glib.h>
 
 #include <Elementary.h>
@@ -15,6 +13,7 @@
 #include "device/telephony.h"
 #include "device/uxt.h"
 #include "support/DeviceFake.h"
+#include "support/FakeCalls.h"
 
 struct tel_handle_s {
     FakeModem modem;
@@ -22,28 +21,12 @@ struct tel_handle_s {
 
 namespace {
 
-std::string quoted(const char* text) {
-    return text ? '"' + std::string(text) + '"' : std::string("null");
-}
-
-std::string typeOf(const Evas_Object* object) {
-    const char* type = object ? evas_object_type_get(object) : nullptr;
-    return type ? type : "null";
-}
+using fakes::quoted;
+using fakes::real;
+using fakes::typeOf;
 
 std::string nameOf(tel_handle_h handle) {
     return handle ? handle->modem.name : "null";
-}
-
-/** The function of the same name in the library behind the test executable. */
-template <typename Function>
-Function* real(const char* name) {
-    void* address = dlsym(RTLD_NEXT, name);
-    if (!address) {
-        std::fprintf(stderr, "CityDeviceFake: no library defines %s\n", name);
-        std::abort();
-    }
-    return reinterpret_cast<Function*>(address);
 }
 
 } // namespace

@@ -20,6 +20,7 @@
 #include "device/uxt.h"
 #include "support/AppControlFake.h"
 #include "support/CityDeviceFake.h"
+#include "support/FakeCalls.h"
 #include "support/SoundFake.h"
 #include "support/ToneFake.h"
 
@@ -29,14 +30,9 @@ struct keynode_s {
 
 namespace {
 
-std::string quoted(const char* text) {
-    return text ? '"' + std::string(text) + '"' : std::string("null");
-}
-
-std::string typeOf(const Evas_Object* object) {
-    const char* type = object ? evas_object_type_get(object) : nullptr;
-    return type ? type : "null";
-}
+using fakes::quoted;
+using fakes::real;
+using fakes::typeOf;
 
 std::string nameOf(sound_type_e type) {
     switch (type) {
@@ -109,17 +105,6 @@ std::string messageOf(const std::string& line) {
     if (text.starts_with(marker))
         text.erase(0, marker.size());
     return text;
-}
-
-/** The function of the same name in the library behind the test executable. */
-template <typename Function>
-Function* real(const char* name) {
-    void* address = dlsym(RTLD_NEXT, name);
-    if (!address) {
-        std::fprintf(stderr, "DeviceFake: no library defines %s\n", name);
-        std::abort();
-    }
-    return reinterpret_cast<Function*>(address);
 }
 
 } // namespace

@@ -1,30 +1,16 @@
 #include "support/I18nFake.h"
 
-#include <cstdio>
-#include <cstdlib>
 #include <string>
 
 #include <device/i18n.h>
-#include <dlfcn.h>
 
 #include "support/DeviceFake.h"
+#include "support/FakeCalls.h"
 
 namespace {
 
-/** The function of the same name in the library behind the test executable. */
-template <typename Function>
-Function* real(const char* name) {
-    void* address = dlsym(RTLD_NEXT, name);
-    if (!address) {
-        std::fprintf(stderr, "I18nFake: no library defines %s\n", name);
-        std::abort();
-    }
-    return reinterpret_cast<Function*>(address);
-}
-
-std::string quoted(const char* text) {
-    return text ? '"' + std::string(text) + '"' : std::string("null");
-}
+using fakes::quoted;
+using fakes::real;
 
 void appendUtf8(std::string& text, char32_t character) {
     const auto byte = [&text](char32_t value) {

@@ -1,38 +1,19 @@
 #include "support/SoundFake.h"
 
 #include <algorithm>
-#include <cstdio>
-#include <cstdlib>
 #include <optional>
-
-#include <dlfcn.h>
 
 #include <clock/ClockSoundPlayer.h>
 #include <device/eext.h>
 
 #include "support/DeviceFake.h"
+#include "support/FakeCalls.h"
 
 namespace {
 
-std::string quoted(const char* text) {
-    return text ? '"' + std::string(text) + '"' : std::string("null");
-}
-
-std::string typeOf(const Evas_Object* object) {
-    const char* type = object ? evas_object_type_get(object) : nullptr;
-    return type ? type : "null";
-}
-
-/** The function of the same name in the library behind the test executable. */
-template <typename Function>
-Function* real(const char* name) {
-    void* address = dlsym(RTLD_NEXT, name);
-    if (!address) {
-        std::fprintf(stderr, "SoundFake: no library defines %s\n", name);
-        std::abort();
-    }
-    return reinterpret_cast<Function*>(address);
-}
+using fakes::quoted;
+using fakes::real;
+using fakes::typeOf;
 
 using KeyFunction = Eina_Bool(Evas_Object*, const char*);
 using Initialize = void(ClockSoundPlayer*, const std::string&, const std::string&, ClockSoundType,

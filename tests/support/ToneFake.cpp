@@ -7,18 +7,21 @@
 #include <string_view>
 
 #include <Ecore_File.h>
-#include <dlfcn.h>
 
 #include <clock/ClockAlarmDbData.h>
 #include <device/metadata_extractor.h>
 
 #include "support/DeviceFake.h"
+#include "support/FakeCalls.h"
 
 struct metadata_extractor_s {
     std::string path;
 };
 
 namespace {
+
+using fakes::quoted;
+using fakes::real;
 
 constexpr std::string_view TONE_FOLDER = "/opt/usr/share/settings/Ringtones/";
 
@@ -37,10 +40,6 @@ std::set<metadata_extractor_h>& extractors() {
 
 bool lives(metadata_extractor_h extractor) {
     return extractors().contains(extractor);
-}
-
-std::string quoted(const char* text) {
-    return text ? '"' + std::string(text) + '"' : std::string("null");
 }
 
 } // namespace
@@ -70,9 +69,7 @@ Eina_Bool ecore_file_exists(const char* file) {
         return EINA_TRUE;
     if (path.starts_with(TONE_FOLDER))
         return EINA_FALSE;
-    static const auto real =
-        reinterpret_cast<decltype(&ecore_file_exists)>(dlsym(RTLD_NEXT, "ecore_file_exists"));
-    return real ? real(file) : EINA_FALSE;
+    return real<decltype(ecore_file_exists)>("ecore_file_exists")(file);
 }
 
 int metadata_extractor_create(metadata_extractor_h* extractor) {
