@@ -6,6 +6,7 @@
 
 #include <functional>
 #include <memory>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -86,7 +87,8 @@ public:
     /** @brief The number in "GMT+05:30", with minutes as a decimal fraction: 5.3. */
     static float _getGmtOffset(const char* timezone);
     /** @brief Whether a text is found in "<city>, <country>" of one city. */
-    static bool _isIncludeSearchText(const ClockWorldClockDbData& city, std::string searchText);
+    static bool _isIncludeSearchText(const ClockWorldClockDbData& city,
+                                     const std::string& searchText);
     /** @brief Whether a list of mobile country codes holds a code. */
     static bool _isMccValueMatched(const char* code, const char* list);
     /** @} */
@@ -138,6 +140,8 @@ private:
     int _newCityPosition = 0;
     /** Country code that the list is narrowed to; empty for all countries. */
     std::string _mcc;
+    /** Text whose cities are shown; none while the list is narrowed to a country. */
+    std::optional<std::string> _shownText;
     std::vector<ClockWorldClockDbData> _cityList;
     WorldClockAddCityCallerType _callerType = ADD_CITY_CALLER_WORLD_CLOCK;
     app_control_s* _appControl = nullptr;

@@ -199,7 +199,7 @@ std::string CityPickerFixture::markupOf(Elm_Object_Item* item, const char* part)
     const Elm_Genlist_Item_Class* itemClass = elm_genlist_item_item_class_get(item);
     char* text = itemClass->func.text_get(elm_object_item_data_get(item),
                                           elm_object_item_widget_get(item), part);
-    const std::string markup = text ? text : "(null)";
+    std::string markup = text ? text : "(null)";
     std::free(text);
     return markup;
 }

@@ -11,7 +11,6 @@ using testing::Each;
 using testing::ElementsAre;
 using testing::HasSubstr;
 using testing::IsEmpty;
-using testing::SizeIs;
 
 namespace {
 

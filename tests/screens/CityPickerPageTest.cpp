@@ -9,11 +9,9 @@
 #include "screens/CityPickerFixture.h"
 #include "screens/TestCatalogue.h"
 
-using testing::Contains;
 using testing::ElementsAre;
 using testing::HasSubstr;
 using testing::IsEmpty;
-using testing::Not;
 using testing::SizeIs;
 
 namespace {

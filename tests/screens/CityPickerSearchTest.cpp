@@ -9,15 +9,10 @@
 #include "WorldClockAddCityItem.h"
 #include "screens/CityPickerFixture.h"
 
-using testing::AllOf;
 using testing::Contains;
-using testing::Each;
 using testing::ElementsAre;
-using testing::HasSubstr;
 using testing::IsEmpty;
 using testing::Le;
-using testing::SizeIs;
-using testing::StartsWith;
 
 namespace {
 

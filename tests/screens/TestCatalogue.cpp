@@ -12,6 +12,8 @@
 
 namespace {
 
+constexpr const char* BUILT_CATALOGUES = CLOCK_RESOURCE_DIR "/locale";
+
 /** The catalogue in the binary form of GNU gettext. */
 std::string compile(std::map<std::string, std::string> texts) {
     texts[""] = "Content-Type: text/plain; charset=UTF-8\n";
@@ -55,7 +57,15 @@ TestCatalogue::TestCatalogue(
 }
 
 TestCatalogue::~TestCatalogue() {
-    use(CLOCK_RESOURCE_DIR "/locale", "en");
+    use(BUILT_CATALOGUES, "en");
     std::error_code ignored;
     std::filesystem::remove_all(_folder, ignored);
+}
+
+CatalogueLanguage::CatalogueLanguage(const std::string& language) {
+    use(BUILT_CATALOGUES, language.c_str());
+}
+
+CatalogueLanguage::~CatalogueLanguage() {
+    use(BUILT_CATALOGUES, "en");
 }

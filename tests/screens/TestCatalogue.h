@@ -24,3 +24,16 @@ public:
 private:
     std::string _folder;
 };
+
+/**
+ * @brief Shows the texts of a language's own catalogue as long as it lives.
+ *
+ * Texts that it does not have read as their identifiers.
+ */
+class CatalogueLanguage {
+public:
+    explicit CatalogueLanguage(const std::string& language);
+    ~CatalogueLanguage();
+    CatalogueLanguage(const CatalogueLanguage&) = delete;
+    CatalogueLanguage& operator=(const CatalogueLanguage&) = delete;
+};
