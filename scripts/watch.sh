@@ -38,6 +38,9 @@ WATCH_VIBRATION_AND_SOUND="120 246"
 WATCH_TONE_BELOW="120 258"          # row of the tone picker, below the one that is marked at first
 WATCH_NEXT_MONTH="266 61"           # calendar: right arrow, and the fourth day of the third week
 WATCH_THIRD_WEDNESDAY="179 177"
+WATCH_SEARCH="140 112"      # city picker: the field, the location button, the first row
+WATCH_LOCATE="296 112"
+WATCH_FIRST_CITY="150 185"
 WATCH_SET="225 310"
 WATCH_CALENDAR_CANCEL="134 310"
 WATCH_KEEP="115 276"        # buttons of the discard popup
@@ -86,7 +89,7 @@ watch_start() {
 }
 
 watch_window_or_end() {
-    xdotool search --onlyvisible --name '^clock-sim$' || ! kill -0 "$watch_pid"
+    xdotool search --onlyvisible --name '^(clock-sim|city-picker)$' || ! kill -0 "$watch_pid"
 }
 
 # watch_stop: ends the simulator as a session's end does. Returns its exit status.

@@ -1,33 +1,23 @@
 #include "AlarmListItem.h"
 
-#include <cstdlib>
 #include <cstring>
 #include <string_view>
 #include <utility>
 
 #include "AlarmListText.h"
+#include "TimeText.h"
 
 #define LOG_TAG "clock-sim"
 #include "base/Log.h"
 
 namespace simulator {
-namespace {
-
-std::string escaped(const std::string& text) {
-    char* markup = elm_entry_utf8_to_markup(text.c_str());
-    std::string result = markup == nullptr ? "" : markup;
-    std::free(markup);
-    return result;
-}
-
-} // namespace
 
 AlarmListItem::AlarmListItem(ClockAlarmDbData alarm, bool twelveHour, SelectedFunction selected)
     : _alarm(std::move(alarm)), _twelveHour(twelveHour), _selected(std::move(selected)) {}
 
 Elm_Genlist_Item_Class* AlarmListItem::getItemClassNew() {
     Elm_Genlist_Item_Class* itemClass = elm_genlist_item_class_new();
-    itemClass->item_style = "simulator.alarm";
+    itemClass->item_style = "simulator.time";
     itemClass->func.text_get = _textGetCb;
     itemClass->func.state_get = _stateGetCb;
     itemClass->func.del = deleteCb;
@@ -47,16 +37,16 @@ char* AlarmListItem::_textGetCb(void* data, Evas_Object*, const char* part) {
         return nullptr;
     }
     const std::string_view name(part);
-    if (name == "alarm.time")
+    if (name == "row.time")
         return strdup(alarmTimeText(self->_alarm, self->_twelveHour).c_str());
-    if (name == "alarm.about")
+    if (name == "row.about")
         return strdup(self->aboutMarkup().c_str());
     return nullptr;
 }
 
 std::string AlarmListItem::aboutMarkup() const {
-    const std::string days = escaped(alarmDaysText(_alarm));
-    return _alarm.name.empty() ? days : "<label>" + escaped(_alarm.name) + "</label><br>" + days;
+    const std::string days = markupOf(alarmDaysText(_alarm));
+    return _alarm.name.empty() ? days : "<label>" + markupOf(_alarm.name) + "</label><br>" + days;
 }
 
 Eina_Bool AlarmListItem::_stateGetCb(void* data, Evas_Object*, const char*) {

@@ -1,9 +1,6 @@
 #include "AlarmListText.h"
 
-#include <array>
-#include <ctime>
-
-#include "clock/ClockIcuDataModel.h"
+#include "TimeText.h"
 #include "clock/ClockText.h"
 #include "rules/DateLine.h"
 #include "rules/WeekdaySet.h"
@@ -11,14 +8,7 @@
 namespace simulator {
 
 std::string alarmTimeText(const ClockAlarmDbData& alarm, bool twelveHour) {
-    constexpr std::time_t MINUTE = 60;
-    constexpr std::time_t HOUR = 60 * MINUTE;
-    // A wall clock reading, not an instant: formatted in a zone that skips no hour.
-    const std::time_t reading = alarm.hour * HOUR + alarm.min * MINUTE;
-    std::array<char, 64> text{};
-    ClockIcuDataModel::getFormattedDateString(reading, text.data(), static_cast<int>(text.size()),
-                                              nullptr, twelveHour ? "hmm" : "HHmm", "UTC");
-    return text.data();
+    return timeOfDayText(alarm.hour, alarm.min, twelveHour);
 }
 
 std::string alarmDaysText(const ClockAlarmDbData& alarm) {

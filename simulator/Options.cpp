@@ -62,7 +62,7 @@ std::string applyPowerSaving(Options& options, const std::string& value) {
     return "";
 }
 
-constexpr std::array<OptionRow, 11> OPTION_ROWS{{
+constexpr std::array<OptionRow, 12> OPTION_ROWS{{
     {"--data", "DIR", "keep settings and alarms in DIR",
      [](Options& o, const std::string& v) {
          return applyDirectory(o.dataDir, v);
@@ -88,6 +88,21 @@ constexpr std::array<OptionRow, 11> OPTION_ROWS{{
          return std::string();
      }},
     {"--edit", "ID", "open the editor on a stored alarm", applyEdit},
+    {"--pick-city", nullptr, "show the city picker alone",
+     [](Options& o, const std::string&) {
+         o.pickCity = true;
+         return std::string();
+     }},
+    {"--world-clock", nullptr, "open the world clock",
+     [](Options& o, const std::string&) {
+         o.worldClock = true;
+         return std::string();
+     }},
+    {"--pick-city", nullptr, "be the city picker alone",
+     [](Options& o, const std::string&) {
+         o.pickCity = true;
+         return std::string();
+     }},
     {"--set-volume", "LEVEL", "set the alarm's volume, 0 to 15, and end", applyVolume},
     {"--power-saving", "on|off", "switch ultra power saving and end", applyPowerSaving},
     {"--version", nullptr, "print the version",
@@ -130,15 +145,30 @@ std::string applyNext(Options& options, const std::vector<std::string>& argument
     return problem.empty() ? "" : "option '" + name + "' " + problem;
 }
 
+/** The given options that say what the watch shows first. */
+std::vector<std::string> openingOptions(const Options& options) {
+    std::vector<std::string> names;
+    if (options.create)
+        names.emplace_back("--create");
+    if (options.editId)
+        names.emplace_back("--edit");
+    if (options.worldClock)
+        names.emplace_back("--world-clock");
+    if (options.pickCity)
+        names.emplace_back("--pick-city");
+    return names;
+}
+
 } // namespace
 
 Options parseOptions(const std::vector<std::string>& arguments) {
     Options options;
     for (std::size_t next = 0; next < arguments.size() && options.error.empty();)
         options.error = applyNext(options, arguments, next);
-    if (options.error.empty() && options.create && options.editId)
-        options.error = "options '--create' and '--edit' exclude each other";
-    if (options.error.empty() && options.onlySets() && (options.create || options.editId))
+    const auto opens = openingOptions(options);
+    if (options.error.empty() && opens.size() > 1)
+        options.error = "options '" + opens[0] + "' and '" + opens[1] + "' exclude each other";
+    if (options.error.empty() && options.onlySets() && !opens.empty())
         options.error = "the watch does not start to set '--set-volume' or '--power-saving'";
     return options;
 }

@@ -14,6 +14,7 @@
 #include "AlarmListViewController.h"
 #include "Foreground.h"
 #include "Keys.h"
+#include "PickCity.h"
 #include "PowerSaving.h"
 #include "QuickPanel.h"
 #include "ToastView.h"
@@ -180,24 +181,62 @@ private:
     Foreground _foreground;
 };
 
-/** The window and what is in it, until the main loop ends. */
-void showClock(const Options& options, const std::string& theme) {
-    app_assist::WWindowController window("clock-sim", FACE_SIZE, FACE_SIZE);
-    if (!window.create(nullptr, nullptr))
-        return;
-    evas_object_smart_callback_add(window.getEvasObj(), "delete,request", closedCb, nullptr);
-    auto* pages = new app_assist::WNaviframeController();
-    pages->setOnEmpty([] { elm_exit(); });
-    window.setBaseController(pages);
-    auto* alarms = new AlarmListViewController(theme);
-    pages->push(alarms);
-    const System system(window.getEvasObj(), theme);
+/** A window with pages in it. */
+class Face {
+public:
+    explicit Face(const char* name) : _window(name, FACE_SIZE, FACE_SIZE) {}
+
+    bool create() {
+        if (!_window.create(nullptr, nullptr))
+            return false;
+        evas_object_smart_callback_add(_window.getEvasObj(), "delete,request", closedCb, nullptr);
+        _pages = new app_assist::WNaviframeController();
+        _pages->setOnEmpty([] { elm_exit(); });
+        _window.setBaseController(_pages);
+        return true;
+    }
+    app_assist::WWindowController& window() { return _window; }
+    void push(app_assist::WContentViewController* page) { _pages->push(page); }
+    /** Until the main loop ends. */
+    void run(const std::string& theme) {
+        const System system(_window.getEvasObj(), theme);
+        evas_object_show(_window.getEvasObj());
+        elm_run();
+    }
+
+private:
+    app_assist::WWindowController _window;
+    app_assist::WNaviframeController* _pages = nullptr;
+};
+
+void openFirst(const Options& options, AlarmListViewController& alarms) {
     if (options.create)
-        alarms->createAlarm();
+        alarms.createAlarm();
     else if (options.editId)
-        alarms->editAlarm(*options.editId);
-    evas_object_show(window.getEvasObj());
-    elm_run();
+        alarms.editAlarm(*options.editId);
+    else if (options.worldClock)
+        alarms.openWorldClock();
+}
+
+void showClock(const Options& options, const std::string& theme) {
+    ClockAlarmManagerModel::synchronize();
+    Face face("clock-sim");
+    if (!face.create())
+        return;
+    auto* alarms = new AlarmListViewController(theme);
+    face.push(alarms);
+    openFirst(options, *alarms);
+    face.run(theme);
+}
+
+void showCityPicker(const std::string& theme) {
+    Face face(CITY_PICKER_NAME);
+    if (!face.create())
+        return;
+    attachToCaller(face.window());
+    face.push(makeCityPicker());
+    face.run(theme);
+    detachFromCaller();
 }
 
 } // namespace
@@ -220,9 +259,15 @@ int runWatch(const Options& options) {
     if (!device.startToolkit())
         return fail("the toolkit cannot be started with the device's theme");
     elm_theme_extension_add(nullptr, theme.c_str());
-    ClockAlarmManagerModel::synchronize();
+    if (options.pickCity) {
+        pickCity(theme);
+        return EXIT_SUCCESS;
+    }
     vconf_notify_key_changed(TIME_FORM_KEY, settingChangedCb, nullptr);
-    showClock(options, theme);
+    if (options.pickCity)
+        showCityPicker(theme);
+    else
+        showClock(options, theme);
     return EXIT_SUCCESS;
 }
 
