@@ -46,10 +46,12 @@ struct Contract {
     std::vector<std::string> parts;
 };
 
-const std::vector<Contract>& contracts() {
-    static const std::vector<std::string> popupParts = {"elm.text.title", "elm.swallow.content",
-                                                        "elm.swallow.action_area"};
-    static const std::vector<Contract> all = {
+using Contracts = std::vector<Contract>;
+
+Contracts pages() {
+    const std::vector<std::string> popupParts = {"elm.text.title", "elm.swallow.content",
+                                                 "elm.swallow.action_area"};
+    return {
         {ROWS, "elm/genlist/item/edit.theme.time/default", {"timepicker.area", "calendar.area"}},
         {ROWS,
          "elm/genlist/item_compress/edit.theme.time/default",
@@ -74,6 +76,11 @@ const std::vector<Contract>& contracts() {
         {DEVICE,
          "elm/popup/buttons2/popup/default",
          {"elm.swallow.content.button1", "elm.swallow.content.button2"}},
+    };
+}
+
+Contracts searching() {
+    return {
         {CITIES, "searchbar.layout", {"entry.part", "location.btn"}},
         {DEVICE, "elm/layout/application/default", {"elm.swallow.content"}},
         {DEVICE, "elm/layout/application/searchbar_base", {"searchbar", "elm.swallow.content"}},
@@ -90,6 +97,11 @@ const std::vector<Contract>& contracts() {
          "elm/index/base/vertical/default",
          {PART_INDEX_LABELS, "elm.swallow.event.0", "bubble", "elm.text"}},
         {DEVICE, "elm/index/item/vertical/default", {PART_INDEX_LABEL}},
+    };
+}
+
+Contracts rowsAndControls() {
+    return {
         {DEVICE, "elm/check/base/on&off", {"track", "knob"}},
         {DEVICE,
          "elm/slider/horizontal/default",
@@ -122,6 +134,15 @@ const std::vector<Contract>& contracts() {
         {DEVICE, GROUP_NUMBER, {PART_VALUE}},
         {DEVICE, GROUP_WORD, {PART_VALUE}},
     };
+}
+
+const Contracts& contracts() {
+    static const Contracts all = [] {
+        Contracts some = pages();
+        for (const Contracts& more : {searching(), rowsAndControls()})
+            some.insert(some.end(), more.begin(), more.end());
+        return some;
+    }();
     return all;
 }
 
