@@ -54,7 +54,7 @@ bool isDescriptorVariable(std::string_view variable, const std::vector<std::stri
 /** This process's environment, with the folders that are in use here. */
 std::vector<std::string> environmentForProgram() {
     std::vector<std::string> variables{
-        CHANNEL_VARIABLE + ("=" + std::to_string(CHANNEL_DESCRIPTOR)),
+        std::string(CHANNEL_VARIABLE).append("=").append(std::to_string(CHANNEL_DESCRIPTOR)),
         "CLOCK_DATA_DIR=" + folders().data,
         "CLOCK_RUNTIME_DIR=" + folders().runtime,
         "CLOCK_RESOURCE_DIR=" + folders().resources,

@@ -5,6 +5,7 @@
 
 WATCH_CREATE="180 325"      # button of the alarm list
 WATCH_FIRST_ALARM="180 165" # first row of the alarm list
+WATCH_WORLD_CLOCK="180 60"  # title's button of either list
 WATCH_CANCEL="124 60"       # title buttons of the editor
 WATCH_DONE="236 60"
 WATCH_HOUR_X=122            # wheels of the editor
@@ -40,6 +41,9 @@ WATCH_NEXT_MONTH="266 61"           # calendar: right arrow, and the fourth day 
 WATCH_THIRD_WEDNESDAY="179 177"
 WATCH_SEARCH="140 112"      # city picker: the field, the location button, the first row
 WATCH_LOCATE="296 112"
+WATCH_CLEAR="240 112"
+WATCH_INDEX_FIRST="341 152" # ends of the index along the rim
+WATCH_INDEX_LAST="311 277"
 WATCH_FIRST_CITY="150 185"
 WATCH_SET="225 310"
 WATCH_CALENDAR_CANCEL="134 310"

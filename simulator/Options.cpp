@@ -62,7 +62,7 @@ std::string applyPowerSaving(Options& options, const std::string& value) {
     return "";
 }
 
-constexpr std::array<OptionRow, 12> OPTION_ROWS{{
+constexpr std::array<OptionRow, 13> OPTION_ROWS{{
     {"--data", "DIR", "keep settings and alarms in DIR",
      [](Options& o, const std::string& v) {
          return applyDirectory(o.dataDir, v);
@@ -96,11 +96,6 @@ constexpr std::array<OptionRow, 12> OPTION_ROWS{{
     {"--world-clock", nullptr, "open the world clock",
      [](Options& o, const std::string&) {
          o.worldClock = true;
-         return std::string();
-     }},
-    {"--pick-city", nullptr, "be the city picker alone",
-     [](Options& o, const std::string&) {
-         o.pickCity = true;
          return std::string();
      }},
     {"--set-volume", "LEVEL", "set the alarm's volume, 0 to 15, and end", applyVolume},

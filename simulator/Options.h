@@ -15,10 +15,9 @@ struct Options {
     bool help = false;
     bool version = false;
     bool create = false;             ///< Open the editor for a new alarm at once.
-    bool pickCity = false;           ///< Show the city picker alone.
     std::optional<int> editId;       ///< Open the editor on a stored alarm at once.
     bool worldClock = false;         ///< Open the world clock at once.
-    bool pickCity = false;           ///< Be the city picker alone.
+    bool pickCity = false;           ///< Show the city picker alone.
     std::optional<bool> twelveHour;  ///< Set the device to 12 or to 24 hours.
     std::optional<int> volume;       ///< Set the alarm's level, and no more.
     std::optional<bool> powerSaving; ///< Switch ultra power saving, and no more.

@@ -259,10 +259,6 @@ int runWatch(const Options& options) {
     if (!device.startToolkit())
         return fail("the toolkit cannot be started with the device's theme");
     elm_theme_extension_add(nullptr, theme.c_str());
-    if (options.pickCity) {
-        pickCity(theme);
-        return EXIT_SUCCESS;
-    }
     vconf_notify_key_changed(TIME_FORM_KEY, settingChangedCb, nullptr);
     if (options.pickCity)
         showCityPicker(theme);

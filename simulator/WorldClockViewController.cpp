@@ -1,8 +1,8 @@
 #include "WorldClockViewController.h"
 
+#include <algorithm>
 #include <ctime>
 #include <utility>
-#include <vector>
 
 #include "TimeText.h"
 #include "WorldClockAddCityViewController.h"
@@ -72,11 +72,8 @@ void WorldClockViewController::addCity() {
         return;
     auto* picker =
         new WorldClockAddCityViewController(ClockWorldClockDbModel().getWorldClockNextPosition());
-    // The picker lies above this page and cannot outlive it.
-    picker->setCityDataReturnFunc([this](ClockWorldClockDbData& city) {
-        _shownKey = city.index;
-        scheduleRefresh();
-    });
+    // The picker lies above this page and cannot outlive it. The page refreshes when it is on top.
+    picker->setCityDataReturnFunc([this](ClockWorldClockDbData& city) { _shownKey = city.index; });
     getNaviframeController()->push(picker);
 }
 
@@ -96,18 +93,28 @@ void WorldClockViewController::askToRemove(const ClockWorldClockDbData& city) {
 }
 
 void WorldClockViewController::remove(const ClockWorldClockDbData& city) {
-    // The model has told why it cannot.
+    // The model tells why it cannot.
     ClockWorldClockDbModel().removeWorldClockDbRecord(city);
+    _shownKey = neighbourOf(city);
     scheduleRefresh();
 }
 
+int WorldClockViewController::neighbourOf(const ClockWorldClockDbData& city) const {
+    const auto place =
+        std::find_if(_cities.begin(), _cities.end(), [&city](const ClockWorldClockDbData& other) {
+            return other.index == city.index;
+        });
+    if (place == _cities.end() || _cities.size() == 1)
+        return NONE;
+    return place + 1 == _cities.end() ? (place - 1)->index : (place + 1)->index;
+}
+
 Elm_Object_Item* WorldClockViewController::appendRows() {
-    std::vector<ClockWorldClockDbData> cities;
-    ClockWorldClockDbModel().getWorldClockSelectedCityList(cities);
+    ClockWorldClockDbModel().getWorldClockSelectedCityList(_cities);
     const bool twelveHour = isTwelveHour();
-    const int shownKey = std::exchange(_shownKey, -1);
+    const int shownKey = std::exchange(_shownKey, NONE);
     Elm_Object_Item* shown = nullptr;
-    for (const ClockWorldClockDbData& city : cities) {
+    for (const ClockWorldClockDbData& city : _cities) {
         Elm_Object_Item* item = append(
             new WorldClockItem(city, twelveHour, [this](const ClockWorldClockDbData& tapped) {
                 askToRemove(tapped);

@@ -6,6 +6,7 @@
 
 #include <memory>
 #include <string>
+#include <vector>
 
 #include <Ecore.h>
 
@@ -43,7 +44,12 @@ private:
     void askToRemove(const ClockWorldClockDbData& city);
     void remove(const ClockWorldClockDbData& city);
 
-    int _shownKey = -1; ///< The city that the next refresh brings into view.
+    /** The city below another one, or above it when it is the last. */
+    int neighbourOf(const ClockWorldClockDbData& city) const;
+
+    static constexpr int NONE = -1; ///< No city's key.
+    std::vector<ClockWorldClockDbData> _cities;
+    int _shownKey = NONE; ///< The city that the next refresh brings into view.
     std::unique_ptr<Ecore_Timer, TimerDeleter> _minuteTimer;
 };
 

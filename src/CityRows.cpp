@@ -7,8 +7,13 @@ namespace {
 // More than the face shows, also after the first flick.
 constexpr std::size_t FIRST_ROWS = 48;
 // Few enough that a key press in between does not wait.
-constexpr std::size_t ROWS_PER_TURN = 96;
+constexpr std::size_t ROWS_PER_TURN = 48;
+// Seconds. Jobs would come before the frame with the first rows, and leave no turn to other events.
+constexpr double UNTIL_DRAWN = 0.016;
+constexpr double BETWEEN_TURNS = 0.001;
 } // namespace
+
+CityRows::CityRows(std::function<void()> filled) : _filled(std::move(filled)) {}
 
 CityRows::~CityRows() {
     stop();
@@ -25,7 +30,7 @@ void CityRows::show(Evas_Object* genlist, Elm_Genlist_Item_Class* itemClass,
     _items.reserve(_cities.size());
     appendUpTo(FIRST_ROWS);
     if (_items.size() < _cities.size())
-        _job = ecore_job_add(_nextRowsCb, this);
+        _timer = ecore_timer_add(UNTIL_DRAWN, _nextRowsCb, this);
 }
 
 void CityRows::link(Elm_Object_Item* indexItem, std::size_t place) {
@@ -38,9 +43,9 @@ void CityRows::complete() {
 }
 
 void CityRows::stop() {
-    if (_job)
-        ecore_job_del(_job);
-    _job = nullptr;
+    if (_timer)
+        ecore_timer_del(_timer);
+    _timer = nullptr;
     if (_genlist)
         evas_object_event_callback_del_full(_genlist, EVAS_CALLBACK_DEL, _genlistDeletedCb, this);
     _genlist = nullptr;
@@ -52,12 +57,17 @@ void CityRows::stop() {
     _links.clear();
 }
 
-void CityRows::_nextRowsCb(void* data) {
+Eina_Bool CityRows::_nextRowsCb(void* data) {
     auto* self = static_cast<CityRows*>(data);
-    self->_job = nullptr;
-    self->appendUpTo(self->_items.size() + ROWS_PER_TURN);
-    if (self->_items.size() < self->_cities.size())
-        self->_job = ecore_job_add(_nextRowsCb, self);
+    if (self->_items.size() < self->_cities.size()) {
+        ecore_timer_interval_set(self->_timer, BETWEEN_TURNS);
+        self->appendUpTo(self->_items.size() + ROWS_PER_TURN);
+        return ECORE_CALLBACK_RENEW;
+    }
+    self->_timer = nullptr;
+    if (self->_filled)
+        self->_filled();
+    return ECORE_CALLBACK_CANCEL;
 }
 
 void CityRows::_genlistDeletedCb(void* data, Evas*, Evas_Object*, void*) {

@@ -11,11 +11,12 @@
 
 /**
  * A list of thousands of rows takes longer to fill than a person waits for a key press. The rows
- * that can be seen are appended at once, the rest a few at each turn.
+ * that can be seen are appended at once, the rest a few at a time once those have been drawn.
  */
 class CityRows {
 public:
-    CityRows() = default;
+    /** @param filled Called once the rows are there, if that took more than one turn. */
+    explicit CityRows(std::function<void()> filled = nullptr);
     ~CityRows();
     CityRows(const CityRows&) = delete;
     CityRows& operator=(const CityRows&) = delete;
@@ -36,7 +37,7 @@ private:
         std::size_t place;
     };
 
-    static void _nextRowsCb(void* data);
+    static Eina_Bool _nextRowsCb(void* data);
     static void _genlistDeletedCb(void* data, Evas* evas, Evas_Object* genlist, void* info);
 
     void appendUpTo(std::size_t end);
@@ -47,5 +48,6 @@ private:
     std::vector<ClockWorldClockDbData*> _cities;
     std::vector<Elm_Object_Item*> _items;
     std::vector<Link> _links;
-    Ecore_Job* _job = nullptr;
+    Ecore_Timer* _timer = nullptr;
+    std::function<void()> _filled;
 };

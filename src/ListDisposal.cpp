@@ -4,12 +4,14 @@
 #include <utility>
 
 namespace {
-constexpr int ROWS_PER_TURN = 96;
-}
+constexpr int ROWS_PER_TURN = 48;
+// Seconds. What takes the list's place is drawn first.
+constexpr double UNTIL_DRAWN = 0.05;
+constexpr double BETWEEN_TURNS = 0.001;
+} // namespace
 
 ListDisposal::~ListDisposal() {
-    if (_job)
-        ecore_job_del(_job);
+    stopTimer();
     for (Evas_Object* genlist : std::exchange(_lists, {})) {
         evas_object_event_callback_del_full(genlist, EVAS_CALLBACK_DEL, _genlistDeletedCb, this);
         evas_object_del(genlist);
@@ -22,17 +24,25 @@ void ListDisposal::add(Evas_Object* genlist) {
     evas_object_hide(genlist);
     evas_object_event_callback_add(genlist, EVAS_CALLBACK_DEL, _genlistDeletedCb, this);
     _lists.push_back(genlist);
-    if (!_job)
-        _job = ecore_job_add(_nextRowsCb, this);
+    stopTimer();
+    _timer = ecore_timer_add(UNTIL_DRAWN, _nextRowsCb, this);
 }
 
-void ListDisposal::_nextRowsCb(void* data) {
+void ListDisposal::stopTimer() {
+    if (_timer)
+        ecore_timer_del(_timer);
+    _timer = nullptr;
+}
+
+Eina_Bool ListDisposal::_nextRowsCb(void* data) {
     auto* self = static_cast<ListDisposal*>(data);
-    self->_job = nullptr;
-    if (!self->_lists.empty())
+    if (!self->_lists.empty()) {
+        ecore_timer_interval_set(self->_timer, BETWEEN_TURNS);
         self->deleteSomeRows();
-    if (!self->_lists.empty())
-        self->_job = ecore_job_add(_nextRowsCb, self);
+        return ECORE_CALLBACK_RENEW;
+    }
+    self->_timer = nullptr;
+    return ECORE_CALLBACK_CANCEL;
 }
 
 void ListDisposal::_genlistDeletedCb(void* data, Evas*, Evas_Object* genlist, void*) {

@@ -14,16 +14,16 @@ public:
     ListDisposal(const ListDisposal&) = delete;
     ListDisposal& operator=(const ListDisposal&) = delete;
 
-    /** Hides a list that is part of nothing any more, and deletes it bit by bit.
-     */
+    /** Hides a list that is part of nothing any more, and deletes it bit by bit. */
     void add(Evas_Object* genlist);
 
 private:
-    static void _nextRowsCb(void* data);
+    static Eina_Bool _nextRowsCb(void* data);
     static void _genlistDeletedCb(void* data, Evas* evas, Evas_Object* genlist, void* info);
 
+    void stopTimer();
     void deleteSomeRows();
 
     std::vector<Evas_Object*> _lists;
-    Ecore_Job* _job = nullptr;
+    Ecore_Timer* _timer = nullptr;
 };

@@ -66,7 +66,8 @@ void WorldClockAddCityViewController::prepare() {
     if (i18n_ucollator_create(locale, &cityCollator) > I18N_ERROR_NONE)
         LOG_ERROR("ucollator create failed, do not sort");
     feedback_initialize();
-    _rows = std::make_unique<CityRows>();
+    // A search is prepared before the first key press asks for it.
+    _rows = std::make_unique<CityRows>([this] { citySearch(); });
     _oldLists = std::make_unique<ListDisposal>();
 }
 
@@ -230,6 +231,7 @@ void WorldClockAddCityViewController::onEvent(ClockEventListener::EventType even
         return;
     // Cities are found by the names that they have now.
     _search.reset();
+    _shownText.reset();
     if (_searchEntry)
         setGuideText();
     if (getNaviItem())

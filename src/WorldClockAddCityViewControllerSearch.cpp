@@ -56,7 +56,9 @@ void WorldClockAddCityViewController::_searchEntryChangedCb(void* data, Evas_Obj
     }
     auto* self = static_cast<WorldClockAddCityViewController*>(data);
     self->_mcc.clear();
-    self->_updateGenlist(text);
+    // A key press that ends a composition changes both texts.
+    if (self->_shownText != text)
+        self->_updateGenlist(text);
 }
 
 void WorldClockAddCityViewController::_updateGenlist(const std::string& searchText) {
@@ -69,6 +71,10 @@ void WorldClockAddCityViewController::_updateGenlist(const std::string& searchTe
         LOG_ERROR("entry is not created yet");
         return;
     }
+    if (_mcc.empty())
+        _shownText = searchText;
+    else
+        _shownText.reset();
     emptyGenlist();
     elm_index_item_clear(_index);
     _cityItem = std::make_unique<WorldClockAddCityItem>();
@@ -177,7 +183,7 @@ float WorldClockAddCityViewController::_getGmtOffset(const char* timezone) {
 }
 
 bool WorldClockAddCityViewController::_isIncludeSearchText(const ClockWorldClockDbData& city,
-                                                           std::string searchText) {
+                                                           const std::string& searchText) {
     return rules::isIncludeSearchText(city, searchText);
 }
 

@@ -21,7 +21,7 @@ runs() {
 says_one_line() { is "$(grep -ac '^clock-sim: ' "$work/err")" 1 && contains "$(grep -a '^clock-sim: ' "$work/err")" "$1"; }
 
 check "--help ends well" runs 0 --help
-for word in --data --resources --language --12h --24h --create --edit --set-volume --power-saving --version Escape F2 F3 F4 F5 F6 F7 F8 F9 F10 "Exit status"; do
+for word in --data --resources --language --12h --24h --create --edit --world-clock --pick-city --set-volume --power-saving --version Escape F2 F3 F4 F5 F6 F7 F8 F9 F10 "Exit status"; do
     check "--help tells about $word" contains "$out" "$word"
 done
 check "--help is quiet on the error stream" is "$err" ""
@@ -46,6 +46,8 @@ check "A value for an option without one is refused" runs 2 --24h=yes
 check "The option without a value is named" says_one_line "'--24h' takes no value"
 check "--create and --edit together are refused" runs 2 --create --edit 1
 check "The two options are named" says_one_line "exclude each other"
+check "The alarms and the world clock together are refused" runs 2 --create --world-clock
+check "These two options are named" says_one_line "'--create' and '--world-clock' exclude each other"
 check "A volume above the loudest is refused" runs 2 --set-volume 16
 check "A level is asked for" says_one_line "needs a level from 0 to 15"
 check "Power saving is on or off" runs 2 --power-saving 2

@@ -39,7 +39,7 @@ protected:
     void TearDown() override {
         _rows.reset();
         takeStageDown();
-        EXPECT_EQ(_itemClass->refcount, 0) << "somebody still holds the item class";
+        EXPECT_EQ(_itemClass->refcount, 1) << "somebody still holds the item class";
         elm_genlist_item_class_free(_itemClass);
         ScreenTest::TearDown();
     }

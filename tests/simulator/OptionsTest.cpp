@@ -46,3 +46,13 @@ TEST(SimulatorOptions, otherwiseTheWatchStarts) {
     EXPECT_FALSE(parseOptions({}).onlySets());
     EXPECT_FALSE(parseOptions({"--24h", "--create"}).onlySets());
 }
+
+TEST(SimulatorOptions, onePageOpensFirst) {
+    EXPECT_TRUE(parseOptions({"--world-clock"}).worldClock);
+    EXPECT_TRUE(parseOptions({"--pick-city"}).pickCity);
+    EXPECT_EQ(parseOptions({"--world-clock", "--edit", "1"}).error,
+              "options '--edit' and '--world-clock' exclude each other");
+    EXPECT_EQ(parseOptions({"--pick-city", "--world-clock"}).error,
+              "options '--world-clock' and '--pick-city' exclude each other");
+    EXPECT_NE(parseOptions({"--set-volume", "3", "--world-clock"}).error, "");
+}
