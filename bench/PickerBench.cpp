@@ -76,7 +76,7 @@ void pressKey(benchmark::State& state, const Step& step) {
     face->open();
     face->rest();
     face->tapEntry();
-    for (auto _ : state) {
+    while (state.KeepRunning()) {
         face->bringTo(step.before);
         face->rest();
         note(state, face->press(step.key, step.after));
@@ -86,7 +86,7 @@ void pressKey(benchmark::State& state, const Step& step) {
 }
 
 void openPicker(benchmark::State& state) {
-    for (auto _ : state) {
+    while (state.KeepRunning()) {
         note(state, face->open());
         noteWork(OPENING, runUntilAsleep());
         face->close();
@@ -97,7 +97,7 @@ void pressInBetween(benchmark::State& state) {
     face->open();
     face->rest();
     face->tapEntry();
-    for (auto _ : state) {
+    while (state.KeepRunning()) {
         face->bringTo("");
         face->rest();
         face->press("a", "a");
@@ -154,7 +154,7 @@ void fillPlainList(benchmark::State& state, const std::string& text) {
     PlainList list(rows);
     list.fill();
     face->rest();
-    for (auto _ : state) {
+    while (state.KeepRunning()) {
         const double start = millisecondsNow();
         list.fill();
         face->drawFrame();
@@ -166,7 +166,7 @@ void fillPlainList(benchmark::State& state, const std::string& text) {
 void drawFrame(benchmark::State& state) {
     face->open();
     face->rest();
-    for (auto _ : state)
+    while (state.KeepRunning())
         note(state, face->drawFrame());
     face->close();
 }
@@ -205,10 +205,12 @@ private:
 /** @return False when a measurement failed. */
 bool measureTimes() {
     std::vector<std::string> names;
-    const auto add = [&names](const std::string& name, auto&& function) {
+    using Function = std::function<void(benchmark::State&)>;
+    const auto add = [&names](const std::string& name, const Function& function) {
         names.push_back(name);
         // Each press once a turn.
-        benchmark::RegisterBenchmark(name.c_str(), function)
+        benchmark::RegisterBenchmark(name.c_str(),
+                                     [function](benchmark::State& state) { function(state); })
             ->Iterations(1)
             ->UseManualTime()
             ->Unit(benchmark::kMillisecond);

@@ -240,6 +240,9 @@ TEST_F(ClockWorldClockDataTest, ALanguageWithoutNamesOfCitiesShowsEnglishOnes) {
 TEST_F(ClockWorldClockDataTest, TheTextsOfTheScreensAreStillThere) {
     EXPECT_STREQ(clockText("IDS_TPLATFORM_ACBUTTON_CANCEL_ABB"), "Cancel");
     setLanguage("de:en");
+    EXPECT_STREQ(clockText("IDS_TPLATFORM_ACBUTTON_DONE_ABB"), "Fertig");
+    // Cities have Norwegian names, the screens have no Norwegian texts.
+    setLanguage("nb:en");
     EXPECT_STREQ(clockText("IDS_TPLATFORM_ACBUTTON_DONE_ABB"), "Done");
 }
 

@@ -1,6 +1,7 @@
 // What becomes of a city that is chosen in the city picker.
 
 #include <functional>
+#include <ostream>
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -149,6 +150,11 @@ struct FailingStep {
     int result;
     std::vector<std::string> messages;
 };
+
+// Otherwise a parameter is printed byte by byte, with what lies between its members.
+void PrintTo(const FailingStep& step, std::ostream* out) {
+    *out << step.function << " = " << step.result;
+}
 
 class CityPickerReplyFailureTest : public CityPickerReturnTest,
                                    public testing::WithParamInterface<FailingStep> {};
