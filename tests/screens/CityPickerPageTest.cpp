@@ -122,14 +122,13 @@ TEST_F(CityPickerPageTest, ALanguageChangeRenewsGuideAndTitle) {
 TEST_F(CityPickerPageTest, AfterALanguageChangeCitiesAreFoundByTheirNewNames) {
     worldOf({"IDS_CITY_NP_KATHMANDU", "IDS_CITY_DE_BERLIN_BERLIN"});
     openPicker();
-    search("berlin");
-    EXPECT_THAT(cities(), ElementsAre("IDS_CITY_DE_BERLIN_BERLIN"));
-    eraseSearch();
-    {
-        const TestCatalogue catalogue({{"IDS_CITY_DE_BERLIN_BERLIN", "Hauptstadt"}});
+    // Both have the same locale: only the event tells that names have changed.
+    for (const std::string name : {"hauptstadt", "metropole"}) {
+        const TestCatalogue catalogue({{"IDS_CITY_DE_BERLIN_BERLIN", name}});
         ClockEventListener::raise(ClockEventListener::LANGUAGE_CHANGED);
-        search("haupt");
+        search(name.substr(0, 4));
         EXPECT_THAT(cities(), ElementsAre("IDS_CITY_DE_BERLIN_BERLIN"));
+        eraseSearch();
     }
 }
 
