@@ -347,7 +347,10 @@ TEST_F(AppControl, AHangingApplicationIsReplacedAsWell) {
         EXPECT_TRUE(isAnswered(2));
     });
     EXPECT_TRUE(iterateUntil([&] { return !isRunning(first); }));
-    EXPECT_EQ(answers.all.size(), 2U);
+    ASSERT_EQ(answers.all.size(), 2U);
+    // Replaced, not broken.
+    EXPECT_EQ(answers.all[0].result, APP_CONTROL_RESULT_CANCELED);
+    EXPECT_EQ(answers.all[1].result, APP_CONTROL_RESULT_CANCELED);
 }
 
 TEST_F(AppControl, DifferentApplicationsRunSideBySide) {
