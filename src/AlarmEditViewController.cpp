@@ -21,6 +21,7 @@
 #include "AlarmTypeItem.h"
 #include "AlarmTypePopupViewController.h"
 #include "AlarmVolumeItem.h"
+#include "ItemClass.h"
 #include "NullData.h"
 #include "ThemePath.h"
 #include "rules/AlarmChange.h"
@@ -36,13 +37,6 @@ constexpr std::size_t EXPECTED_ALARMS = 20;
 constexpr std::array TRANSLATED_ROWS = {EditorRow::Repeat,         EditorRow::Type,
                                         EditorRow::Tone,           EditorRow::Snooze,
                                         EditorRow::IncreaseVolume, EditorRow::Name};
-
-struct ItemClassFree {
-    void operator()(Elm_Genlist_Item_Class* itemClass) const {
-        elm_genlist_item_class_free(itemClass);
-    }
-};
-using ItemClass = std::unique_ptr<Elm_Genlist_Item_Class, ItemClassFree>;
 
 bool isThemeExtension(const std::string& path) {
     for (const Eina_List* node = elm_theme_extension_list_get(nullptr); node;

@@ -1,8 +1,6 @@
 #define LOG_TAG "WORLDCLOCK"
 #include "WorldClockAddCityViewController.h"
 
-#include <array>
-#include <cstdio>
 #include <utility>
 
 #include <Ecore_IMF.h>

@@ -12,6 +12,7 @@
 #include <device/i18n.h>
 
 #include "CityRows.h"
+#include "ItemClass.h"
 #include "ListDisposal.h"
 #include "NullData.h"
 #include "WorldClockAddCityItem.h"
@@ -28,12 +29,6 @@ constexpr std::size_t FEW_ROWS = 10;
 // Longer lists are not emptied but replaced.
 constexpr unsigned QUICKLY_EMPTIED_ROWS = 128;
 
-struct ItemClassFree {
-    void operator()(Elm_Genlist_Item_Class* itemClass) const {
-        elm_genlist_item_class_free(itemClass);
-    }
-};
-using ItemClass = std::unique_ptr<Elm_Genlist_Item_Class, ItemClassFree>;
 using Text = std::unique_ptr<char, decltype(&std::free)>;
 
 } // namespace
