@@ -121,6 +121,24 @@ int utcOffset(std::int64_t instant, const std::string& timeZone) {
     return zone ? static_cast<int>(zone->get_info(toLibrary(instant)).offset.count()) : 0;
 }
 
+std::optional<std::int64_t> nextOffsetChange(std::int64_t after, const std::string& timeZone) {
+    const auto* zone = zoneOf(timeZone);
+    if (!zone)
+        return std::nullopt;
+    auto info = zone->get_info(toLibrary(after));
+    const auto offset = info.offset;
+    // A zone may also change its name alone.
+    while (info.offset == offset) {
+        if (info.end >= LATEST || info.end <= info.begin)
+            return std::nullopt;
+        const auto next = zone->get_info(info.end);
+        if (next.begin < info.end)
+            return std::nullopt;
+        info = next;
+    }
+    return info.begin.time_since_epoch().count();
+}
+
 CivilTime toCivil(std::int64_t instant, const std::string& timeZone) {
     const auto reading = toLibrary(instant) + seconds(utcOffset(instant, timeZone));
     const auto days = date::floor<date::days>(reading);

@@ -46,6 +46,12 @@ bool isTimeZone(const std::string& timeZone);
 /** @brief Seconds that a time zone's clocks are ahead of UTC at an instant. */
 int utcOffset(std::int64_t instant, const std::string& timeZone);
 
+/**
+ * @brief When a time zone's clocks are next put forward or back, strictly after an instant.
+ * @return Epoch seconds, or nothing when no change is known.
+ */
+std::optional<std::int64_t> nextOffsetChange(std::int64_t after, const std::string& timeZone);
+
 /** @brief The wall clock reading of an instant (epoch seconds) in a time zone. */
 CivilTime toCivil(std::int64_t instant, const std::string& timeZone);
 
