@@ -11,54 +11,11 @@ namespace {
 
 constexpr std::string_view requestKind = "clock application request 1";
 constexpr std::string_view replyKind = "clock application reply 1";
-constexpr std::size_t lengthSize = 4;
-
-void appendLength(std::string& bytes, std::size_t length) {
-    for (const int shift : {24, 16, 8, 0})
-        bytes += static_cast<char>(length >> shift & 0xFF);
-}
-
-std::size_t lengthAt(std::string_view bytes) {
-    std::size_t length = 0;
-    for (const char byte : bytes.substr(0, lengthSize))
-        length = length << 8 | static_cast<unsigned char>(byte);
-    return length;
-}
-
-void appendText(std::string& message, std::string_view text) {
-    appendLength(message, text.size());
-    message += text;
-}
-
-void appendExtras(std::string& message, const app_control_s& control) {
+void appendExtras(std::vector<std::string>& texts, const app_control_s& control) {
     for (const auto& [key, value] : control.extras) {
-        appendText(message, key);
-        appendText(message, value);
+        texts.push_back(key);
+        texts.push_back(value);
     }
-}
-
-std::optional<std::string> withLength(const std::string& message) {
-    if (message.size() > MESSAGE_LIMIT)
-        return std::nullopt;
-    std::string framed;
-    appendLength(framed, message.size());
-    return framed + message;
-}
-
-/** The texts of a message, or none when a length is wrong. */
-std::vector<std::string_view> textsOf(std::string_view message) {
-    std::vector<std::string_view> texts;
-    while (!message.empty()) {
-        if (message.size() < lengthSize)
-            return {};
-        const std::size_t length = lengthAt(message);
-        message.remove_prefix(lengthSize);
-        if (length > message.size() || length > TEXT_LIMIT)
-            return {};
-        texts.push_back(message.substr(0, length));
-        message.remove_prefix(length);
-    }
-    return texts;
 }
 
 template <typename Number>
@@ -98,27 +55,22 @@ bool isResult(int result) {
 }
 
 std::optional<std::string> encodeRequest(const app_control_s& request) {
-    std::string message;
-    appendText(message, requestKind);
-    appendText(message, request.appId);
-    appendText(message, request.operation);
-    appendText(message, std::to_string(request.mode));
-    appendText(message, std::to_string(request.callerWindow));
-    appendExtras(message, request);
-    return withLength(message);
+    std::vector<std::string> texts{std::string(requestKind), request.appId, request.operation,
+                                   std::to_string(request.mode),
+                                   std::to_string(request.callerWindow)};
+    appendExtras(texts, request);
+    return base::encodeMessage(texts);
 }
 
 std::optional<std::string> encodeReply(const Reply& reply) {
-    std::string message;
-    appendText(message, replyKind);
-    appendText(message, std::to_string(reply.result));
-    appendExtras(message, reply.texts);
-    return withLength(message);
+    std::vector<std::string> texts{std::string(replyKind), std::to_string(reply.result)};
+    appendExtras(texts, reply.texts);
+    return base::encodeMessage(texts);
 }
 
 std::optional<app_control_s> decodeRequest(std::string_view message) {
     constexpr std::size_t head = 5;
-    const auto texts = textsOf(message);
+    const auto texts = base::textsOfMessage(message, TEXT_LIMIT);
     app_control_s request;
     int mode = -1;
     if (texts.size() < head || texts[0] != requestKind || !readNumber(texts[3], mode) ||
@@ -133,7 +85,7 @@ std::optional<app_control_s> decodeRequest(std::string_view message) {
 
 std::optional<Reply> decodeReply(std::string_view message) {
     constexpr std::size_t head = 2;
-    const auto texts = textsOf(message);
+    const auto texts = base::textsOfMessage(message, TEXT_LIMIT);
     Reply reply;
     int result = 1;
     if (texts.size() < head || texts[0] != replyKind || !readNumber(texts[1], result) ||
@@ -141,21 +93,6 @@ std::optional<Reply> decodeReply(std::string_view message) {
         return std::nullopt;
     reply.result = static_cast<app_control_result_e>(result);
     return reply;
-}
-
-std::optional<std::string> MessageReader::next() {
-    if (_bytes.size() < lengthSize || isOverlong())
-        return std::nullopt;
-    const std::size_t length = lengthAt(_bytes);
-    if (_bytes.size() < lengthSize + length)
-        return std::nullopt;
-    std::string message = _bytes.substr(lengthSize, length);
-    _bytes.erase(0, lengthSize + length);
-    return message;
-}
-
-bool MessageReader::isOverlong() const {
-    return _bytes.size() >= lengthSize && lengthAt(_bytes) > MESSAGE_LIMIT;
 }
 
 } // namespace host

@@ -11,6 +11,7 @@
 #include <utility>
 #include <vector>
 
+#include "base/Message.h"
 #include "device/app_control.h"
 
 /** What a handle of application control points to. */
@@ -28,8 +29,8 @@ namespace host {
 
 /** Longest text in bytes: no key or value of an application comes near it. */
 inline constexpr std::size_t TEXT_LIMIT = 64UL * 1024;
-/** Longest message in bytes; whoever announces a longer one does not speak this protocol. */
-inline constexpr std::size_t MESSAGE_LIMIT = 1024UL * 1024;
+using base::MESSAGE_LIMIT;
+using base::MessageReader;
 
 /** An answer as it travels. */
 struct Reply {
@@ -42,8 +43,7 @@ bool isResult(int result);
 
 /**
  * @name Messages
- * A message is its length and its texts, each text is its length and its bytes; lengths have four
- * bytes, the highest first. The first text tells what the message is.
+ * The first text of a message tells what it is.
  * @{
  */
 /** @return The whole message with its length in front, or nothing when it would be too long. */
@@ -53,20 +53,5 @@ std::optional<std::string> encodeReply(const Reply& reply);
 std::optional<app_control_s> decodeRequest(std::string_view message);
 std::optional<Reply> decodeReply(std::string_view message);
 /** @} */
-
-/** Puts messages together from the pieces in which they arrive. */
-class MessageReader {
-public:
-    void add(std::string_view bytes) { _bytes.append(bytes); }
-    /** The next whole message without its length, if it is there already. */
-    std::optional<std::string> next();
-    /** True once a message is announced that is longer than any can be. */
-    bool isOverlong() const;
-    /** True when no part of a message is waiting for its rest. */
-    bool isEmpty() const { return _bytes.empty(); }
-
-private:
-    std::string _bytes;
-};
 
 } // namespace host

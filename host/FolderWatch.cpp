@@ -37,15 +37,15 @@ FolderWatch::~FolderWatch() {
     ecore_shutdown();
 }
 
-int FolderWatch::add(const std::string& folder) {
+int FolderWatch::add(const std::string& folder, unsigned more) {
     if (!_handler)
         return EMFILE;
     if (const int problem = createFolder(folder))
         return problem;
-    const int watch = inotify_add_watch(_inotify, folder.c_str(), changes);
+    const int watch = inotify_add_watch(_inotify, folder.c_str(), changes | more);
     if (watch < 0)
         return errno;
-    _folders[watch] = folder;
+    _folders[watch] = {folder, more};
     return 0;
 }
 
@@ -53,10 +53,10 @@ void FolderWatch::watchAgain(int watch) {
     const auto found = _folders.find(watch);
     if (found == _folders.end())
         return;
-    const std::string folder = found->second;
+    const Watched watched = found->second;
     _folders.erase(found);
-    if (const int problem = add(folder))
-        LOG_ERROR("Changes in %s go unseen: %s", folder.c_str(), std::strerror(problem));
+    if (const int problem = add(watched.folder, watched.more))
+        LOG_ERROR("Changes in %s go unseen: %s", watched.folder.c_str(), std::strerror(problem));
 }
 
 std::vector<std::string> FolderWatch::readChanges() {

@@ -25,8 +25,12 @@ public:
     FolderWatch(const FolderWatch&) = delete;
     FolderWatch& operator=(const FolderWatch&) = delete;
 
-    /** Watches a folder, which is created when it is missing. @return 0 or an errno. */
-    int add(const std::string& folder);
+    /**
+     * @brief Watches a folder, which is created when it is missing.
+     * @param more Events of inotify to be told of besides files that were written or deleted.
+     * @return 0 or an errno.
+     */
+    int add(const std::string& folder, unsigned more = 0);
 
 private:
     static Eina_Bool _readableCb(void* data, Ecore_Fd_Handler* handler);
@@ -36,7 +40,11 @@ private:
     Changed _changed;
     int _inotify = -1;
     Ecore_Fd_Handler* _handler = nullptr;
-    std::map<int, std::string> _folders;
+    struct Watched {
+        std::string folder;
+        unsigned more = 0;
+    };
+    std::map<int, Watched> _folders;
     std::shared_ptr<bool> _alive = std::make_shared<bool>(true);
 };
 

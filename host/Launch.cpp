@@ -14,6 +14,8 @@
 #include <sys/wait.h>
 #include <unistd.h>
 
+#include "remote/FrontWatch.h"
+
 #define LOG_TAG "device-host"
 #include "base/Log.h"
 
@@ -39,6 +41,7 @@ void finish(pid_t process, bool well) {
         return;
     const std::unique_ptr<Launch> launch = std::move(*found);
     launches().erase(found);
+    forgetFace(process);
     launch->ended(well);
 }
 
@@ -243,6 +246,13 @@ void Launch::answer(Reply reply) {
 void Launch::fail(const char* why) {
     LOG_ERROR("%s (process %d): %s", appId().c_str(), process(), why);
     answer({APP_CONTROL_RESULT_FAILED, {}});
+}
+
+std::vector<pid_t> launchedProcesses() {
+    std::vector<pid_t> processes;
+    for (const auto& open : launches())
+        processes.push_back(open->process());
+    return processes;
 }
 
 int launch(const app_control_s& request, ReplyTo replyTo) {

@@ -5,6 +5,7 @@
 #pragma once
 
 #include <string>
+#include <vector>
 
 #include <Ecore.h>
 
@@ -66,6 +67,9 @@ private:
     bool _answered = false;
     bool _killed = false;
 };
+
+/** The processes of the applications that were started here and still run. */
+std::vector<pid_t> launchedProcesses();
 
 /** @brief Starts the application of a request. @return One of app_control_error_e. */
 int launch(const app_control_s& request, ReplyTo replyTo);

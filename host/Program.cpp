@@ -15,6 +15,7 @@
 #include <unistd.h>
 
 #include "Folders.h"
+#include "Language.h"
 
 namespace fs = std::filesystem;
 
@@ -58,6 +59,7 @@ std::vector<std::string> environmentForProgram() {
         "CLOCK_DATA_DIR=" + folders().data,
         "CLOCK_RUNTIME_DIR=" + folders().runtime,
         "CLOCK_RESOURCE_DIR=" + folders().resources,
+        "LANGUAGE=" + environmentLanguages(),
     };
     const std::vector<std::string> replacements = variables;
     for (char** variable = environ; variable && *variable; ++variable)

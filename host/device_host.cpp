@@ -4,10 +4,14 @@
 
 #include <Elementary.h>
 
+#include "Accessibility.h"
+#include "DeviceClock.h"
 #include "Folders.h"
 #include "Language.h"
+#include "Motion.h"
 #include "Settings.h"
 #include "base/Text.h"
+#include "remote/FaceAgent.h"
 #include "widgets/DateTime.h"
 
 #define LOG_TAG "device-host"
@@ -56,6 +60,7 @@ void configureTouch() {
     // A desktop's aids for keyboard and mouse, of no use on a watch.
     elm_config_context_menu_disabled_set(EINA_TRUE);
     elm_config_magnifier_enable_set(EINA_FALSE);
+    // The device itself leads the focus and rings it.
     elm_config_focus_highlight_enabled_set(EINA_FALSE);
     elm_config_item_select_on_focus_disabled_set(EINA_TRUE);
     // What takes the focus when a field gives it up must not pull the page away from under it.
@@ -84,6 +89,7 @@ int device_host_init(const device_host_config_s* config, char* error, size_t err
     }
     host::applyLocale();
     host::bindTexts(host::folders().resources + "/locale");
+    host::applyClock();
     return 0;
 }
 
@@ -106,14 +112,26 @@ int device_host_init_toolkit(void) {
     forgetTheme();
     elm_theme_overlay_add(nullptr, theme.c_str());
     themeInUse() = theme;
+    host::followLanguage();
+    host::followMotion();
+    // The program may have written settings since the device was started.
+    host::applyClock();
+    if (!host::followClock())
+        LOG_WARNING("Changes of the clock and the time zone go unnoticed");
+    host::FaceAgent::listenIfAsked();
+    host::followScreenReaders();
     return 0;
 }
 
 void device_host_shutdown(void) {
+    host::FaceAgent::end();
     host::forgetVolumeCallback();
     host::forgetSettingCallbacks();
     device_host_set_toast_callback(nullptr, nullptr);
+    device_host_set_log_callback(nullptr, nullptr);
     host::endFeedback();
+    host::forgetClock();
     forgetTheme();
+    host::forgetLanguage();
     host::forgetFolders();
 }

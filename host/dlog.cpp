@@ -3,11 +3,28 @@
 #include <cerrno>
 #include <cstdarg>
 #include <cstdio>
+#include <mutex>
 #include <string>
+#include <utility>
 
 #include <unistd.h>
 
+#include "device_host.h"
+
 namespace {
+
+struct Listener {
+    device_host_log_cb callback = nullptr;
+    void* data = nullptr;
+};
+
+std::mutex& listenerMutex() {
+    // Never destroyed: threads may log until the process ends.
+    static auto* const mutex = new std::mutex;
+    return *mutex;
+}
+
+Listener listener;
 
 /** The formatted text, or nothing to print when the format cannot be followed. */
 bool format(std::string& text, const char* format, va_list arguments) {
@@ -42,9 +59,29 @@ void keepOnOneLine(std::string& text) {
     }
 }
 
+void tellListener(int priority, const char* tag, std::string message) {
+    // What a listener logs is not told to it again.
+    thread_local bool telling = false;
+    if (std::exchange(telling, true))
+        return;
+    removeColours(message);
+    keepOnOneLine(message);
+    {
+        const std::scoped_lock lock(listenerMutex());
+        if (listener.callback)
+            listener.callback(priority, tag, message.c_str(), listener.data);
+    }
+    telling = false;
+}
+
 } // namespace
 
-int __dlog_print(log_id_t /*id*/, int /*priority*/, const char* tag, const char* format, ...) {
+void device_host_set_log_callback(device_host_log_cb callback, void* data) {
+    const std::scoped_lock lock(listenerMutex());
+    listener = {callback, data};
+}
+
+int __dlog_print(log_id_t /*id*/, int priority, const char* tag, const char* format, ...) {
     if (!tag || !format)
         return -1;
     const int savedError = errno;
@@ -55,6 +92,7 @@ int __dlog_print(log_id_t /*id*/, int /*priority*/, const char* tag, const char*
     va_end(arguments);
     if (!formatted)
         return -1;
+    tellListener(priority, tag, message);
     if (!isatty(STDERR_FILENO))
         removeColours(message);
     std::string line = std::string(tag) + " " + message;

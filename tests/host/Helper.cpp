@@ -1,11 +1,14 @@
 #include "Helper.h"
 
+#include <atomic>
 #include <csignal>
 #include <cstdio>
 #include <cstdlib>
 #include <filesystem>
 #include <fstream>
 #include <sstream>
+#include <string_view>
+#include <utility>
 
 #include <Ecore.h>
 #include <gtest/gtest.h>
@@ -105,6 +108,41 @@ std::string standardErrorOf(const std::function<void()>& action) {
     testing::internal::CaptureStderr();
     action();
     return testing::internal::GetCapturedStderr();
+}
+
+namespace {
+
+/** Whether a line with a text has been logged. */
+class LineWatch {
+public:
+    explicit LineWatch(std::string text) : _text(std::move(text)) {
+        device_host_set_log_callback(lineCb, this);
+    }
+    ~LineWatch() { device_host_set_log_callback(nullptr, nullptr); }
+    LineWatch(const LineWatch&) = delete;
+    LineWatch& operator=(const LineWatch&) = delete;
+
+    bool isSeen() const { return _seen; }
+
+private:
+    static void lineCb(int, const char*, const char* line, void* data) {
+        auto* watch = static_cast<LineWatch*>(data);
+        if (std::string_view(line).find(watch->_text) != std::string_view::npos)
+            watch->_seen = true;
+    }
+
+    std::string _text;
+    std::atomic<bool> _seen = false;
+};
+
+} // namespace
+
+std::string standardErrorUntil(const std::string& text, const std::function<void()>& action) {
+    return standardErrorOf([&] {
+        const LineWatch watch(text);
+        action();
+        iterateUntil([&] { return watch.isSeen(); });
+    });
 }
 
 TemporaryFolder::TemporaryFolder() {

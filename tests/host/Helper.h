@@ -28,6 +28,12 @@ void iterateFor(double seconds);
 /** What is written to standard error while an action runs. */
 std::string standardErrorOf(const std::function<void()>& action);
 
+/**
+ * @brief The same, going on with the main loop until the log has a line with a text: what other
+ * threads report comes when they get to it.
+ */
+std::string standardErrorUntil(const std::string& text, const std::function<void()>& action);
+
 /** An empty folder that is removed with everything in it. */
 class TemporaryFolder {
 public:
