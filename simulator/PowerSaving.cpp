@@ -18,10 +18,13 @@ bool setPowerSaving(bool on) {
     return vconf_set_int(KEY, on ? ULTRA : OFF) == VCONF_OK;
 }
 
-void togglePowerSaving() {
+bool isPowerSaving() {
     int mode = OFF;
-    vconf_get_int(KEY, &mode);
-    const bool on = mode != ULTRA;
+    return vconf_get_int(KEY, &mode) == VCONF_OK && mode == ULTRA;
+}
+
+void togglePowerSaving() {
+    const bool on = !isPowerSaving();
     if (!setPowerSaving(on)) {
         LOG_ERROR("Ultra power saving cannot be switched");
         return;
