@@ -8,6 +8,8 @@
 #include <unicode/locid.h>
 #include <unicode/numsys.h>
 
+#include "base/ScreenLocale.h"
+
 namespace host {
 
 namespace {
@@ -94,8 +96,8 @@ std::vector<std::string> TimeTexts::minutes() const {
 }
 
 const TimeTexts& timeTextsOf(const char* locale) {
-    const icu::Locale icuLocale =
-        locale && *locale ? icu::Locale::createCanonical(locale) : icu::Locale::getDefault();
+    const icu::Locale icuLocale = base::screenLocale(
+        locale && *locale ? icu::Locale::createCanonical(locale) : icu::Locale::getDefault());
     // A device speaks few languages, and a picker is made many times over.
     static std::map<std::string, TimeTexts> known;
     const auto [entry, isNew] = known.try_emplace(icuLocale.getName());

@@ -16,6 +16,7 @@
 #include <base/CivilTime.h>
 #include <base/Log.h>
 #include <base/MessageLocale.h>
+#include <base/ScreenLocale.h>
 #include <base/Text.h>
 
 namespace {
@@ -33,7 +34,7 @@ icu::SimpleDateFormat* findFormat(const std::string& locale, const std::string& 
         return known->second.get();
 
     UErrorCode status = U_ZERO_ERROR;
-    const icu::Locale icuLocale(locale.c_str());
+    const icu::Locale icuLocale = base::screenLocale(icu::Locale(locale.c_str()));
     const std::unique_ptr<icu::DateTimePatternGenerator> generator(
         icu::DateTimePatternGenerator::createInstance(icuLocale, status));
     if (U_FAILURE(status) || !generator)

@@ -10,6 +10,7 @@
 #include <vector>
 
 #include <base/Log.h>
+#include <base/ScreenLocale.h>
 #include <base/Text.h>
 
 #include "clock/AlarmRing.h"
@@ -36,8 +37,9 @@ std::string spanText(int days, int hours, int minutes) {
     add(minutes, icu::MeasureUnit::createMinute(status));
     if (measures.empty())
         return {};
-    const icu::MeasureFormat format(icu::Locale(ClockIcuDataModel::getCurrentLocale()),
-                                    UMEASFMT_WIDTH_WIDE, status);
+    const icu::MeasureFormat format(
+        base::screenLocale(icu::Locale(ClockIcuDataModel::getCurrentLocale())), UMEASFMT_WIDTH_WIDE,
+        status);
     icu::UnicodeString text;
     icu::FieldPosition position;
     format.formatMeasures(measures.data(), static_cast<std::int32_t>(measures.size()), text,

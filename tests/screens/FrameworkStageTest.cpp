@@ -258,6 +258,7 @@ TEST_F(FrameworkStageTest, picturesTellWhatChanged) {
     EXPECT_EQ(comparePictures(one, other, 0).fraction, 0);
     other.pixels[1] += 10;
     EXPECT_EQ(comparePictures(one, other, 10).fraction, 0);
+    other.pixels[1] += 30;
     EXPECT_EQ(comparePictures(one, other, 9).fraction, 0.25);
     EXPECT_EQ(comparePictures(other, one, 9).fraction, 0.25);
     EXPECT_EQ(comparePictures(one, other, 9).picture.pixels[1], 0xFFFF0000);
@@ -268,7 +269,7 @@ TEST_F(FrameworkStageTest, aMovedEdgeIsNoChangeButAMissingLineIs) {
     constexpr std::uint32_t BLACK = 0xFF000000;
     constexpr std::uint32_t WHITE = 0xFFFFFFFF;
     const Picture line{6, 1, {BLACK, BLACK, WHITE, WHITE, BLACK, BLACK}};
-    const Picture moved{6, 1, {BLACK, BLACK, 0xFF606060, WHITE, 0xFFA0A0A0, BLACK}};
+    const Picture moved{6, 1, {BLACK, BLACK, 0xFF787878, WHITE, 0xFF888888, BLACK}};
     const Picture missing{6, 1, std::vector<std::uint32_t>(6, BLACK)};
     EXPECT_EQ(comparePictures(line, moved, 24).fraction, 0);
     EXPECT_EQ(comparePictures(moved, line, 24).fraction, 0);

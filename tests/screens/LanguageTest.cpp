@@ -1,6 +1,7 @@
 // The screens in every language that the clock has a catalogue for.
 
 #include <algorithm>
+#include <array>
 #include <cstdint>
 #include <cstdio>
 #include <filesystem>
@@ -17,6 +18,9 @@
 #include <Elementary.h>
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
+#include <unicode/plurrule.h>
+#include <unicode/unistr.h>
+#include <unicode/ures.h>
 
 #include <clock/ClockStringUtil.h>
 #include <clock/ClockText.h>
@@ -24,6 +28,8 @@
 #include "screens/CityPickerFixture.h"
 #include "screens/EditorFixture.h"
 #include "screens/TestCatalogue.h"
+#include "support/LiveLanguage.h"
+#include "support/TextFaults.h"
 
 namespace fs = std::filesystem;
 
@@ -48,45 +54,6 @@ std::string nameOf(const testing::TestParamInfo<std::string>& language) {
     return language.param;
 }
 
-struct FontOf {
-    const char* name = nullptr;
-    int size = 0;
-};
-
-FontOf fontOf(const Evas_Object* text) {
-    FontOf font;
-    evas_object_text_font_get(text, &font.name, &font.size);
-    return font;
-}
-
-/** The width of a text that has all the room it wants. */
-int fullWidth(const FoundText& found) {
-    const auto font = fontOf(found.object);
-    Evas_Object* const copy = evas_object_text_add(evas_object_evas_get(found.object));
-    evas_object_text_font_set(copy, font.name, font.size);
-    evas_object_text_text_set(copy, found.text.c_str());
-    const int width = Stage::area(copy).width;
-    evas_object_del(copy);
-    return width;
-}
-
-bool isCut(const FoundText& found) {
-    return std::string_view(evas_object_type_get(found.object)) == "text" &&
-           fullWidth(found) > Stage::area(found.object).width;
-}
-
-/** What is wrong with the texts that can be seen. */
-std::vector<std::string> faultsOf(const std::vector<FoundText>& texts) {
-    std::vector<std::string> faults;
-    for (const FoundText& found : texts) {
-        if (found.text.find("IDS_") != std::string::npos)
-            faults.push_back(found.text + " has no translation");
-        else if (isCut(found))
-            faults.push_back(found.text + " is cut");
-    }
-    return faults;
-}
-
 std::vector<FoundText> without(std::vector<FoundText> texts, const char* widgetType) {
     std::erase_if(texts, [&](const FoundText& found) {
         return std::string_view(elm_object_widget_type_get(found.widget)) == widgetType;
@@ -98,7 +65,8 @@ std::vector<FoundText> without(std::vector<FoundText> texts, const char* widgetT
 class EditorLanguageTest : public EditorFixture, public testing::WithParamInterface<std::string> {
 protected:
     void speak(const std::string& language) {
-        _language = std::make_unique<CatalogueLanguage>(language);
+        _language = std::make_unique<LiveLanguage>();
+        _language->choose(language);
     }
     void TearDown() override {
         EditorFixture::TearDown();
@@ -123,7 +91,7 @@ protected:
     void take(const std::string& name) { stage().screenshot("language-" + GetParam() + name); }
 
 private:
-    std::unique_ptr<CatalogueLanguage> _language;
+    std::unique_ptr<LiveLanguage> _language;
 };
 
 TEST_P(EditorLanguageTest, EveryRowIsTranslatedAndFits) {
@@ -247,6 +215,50 @@ TEST_F(SpanTest, CountsHaveTheFormsOfTheirLanguage) {
     EXPECT_EQ(toast("zh_CN", 1, 1, 2), "闹钟将在1天1小时2分钟后响起。");
 }
 
+constexpr std::array COUNTS = {1, 2, 3, 5, 11, 21, 100};
+
+/** "few", "other" and so on. */
+std::string pluralForm(const std::string& language, int count) {
+    UErrorCode status = U_ZERO_ERROR;
+    const std::unique_ptr<icu::PluralRules> rules(
+        icu::PluralRules::forLocale(icu::Locale(language.c_str()), status));
+    std::string form;
+    if (U_SUCCESS(status))
+        rules->select(count).toUTF8String(form);
+    return form;
+}
+
+/** How a count of days is written, "{0} days", in the language's own table. */
+std::string daysPattern(const std::string& language, const std::string& form) {
+    using Bundle = std::unique_ptr<UResourceBundle, decltype(&ures_close)>;
+    UErrorCode status = U_ZERO_ERROR;
+    Bundle bundle(ures_open(U_ICUDATA_NAME "-unit", language.c_str(), &status), &ures_close);
+    for (const char* key : {"units", "duration", "day"})
+        bundle.reset(ures_getByKey(bundle.get(), key, nullptr, &status));
+    int32_t length = 0;
+    const UChar* text = ures_getStringByKey(bundle.get(), form.c_str(), &length, &status);
+    std::string pattern;
+    if (U_SUCCESS(status))
+        icu::UnicodeString(text, length).toUTF8String(pattern);
+    return pattern;
+}
+
+class PluralTest : public ScreenTest, public testing::WithParamInterface<std::string> {};
+
+TEST_P(PluralTest, TheToastCountsAsTheLanguageDoes) {
+    for (const int count : COUNTS) {
+        const std::string text = toast(GetParam().c_str(), count, 0, 0);
+        std::string pattern = daysPattern(GetParam(), pluralForm(GetParam(), count));
+        ASSERT_NE(pattern, "") << GetParam() << ' ' << count;
+        if (const auto place = pattern.find("{0}"); place != std::string::npos)
+            pattern.replace(place, 3, std::to_string(count));
+        EXPECT_THAT(text, HasSubstr(pattern)) << count;
+        EXPECT_THAT(text, Not(HasSubstr("IDS_")));
+    }
+}
+
+INSTANTIATE_TEST_SUITE_P(Language, PluralTest, testing::ValuesIn(languages()), nameOf);
+
 /** The city picker. */
 class CitiesLanguageTest : public CityPickerFixture,
                            public testing::WithParamInterface<std::string> {
@@ -257,15 +269,22 @@ protected:
     }
 
     void open() {
-        _language = std::make_unique<CatalogueLanguage>(GetParam());
+        _language = std::make_unique<LiveLanguage>();
+        _language->choose(GetParam());
         worldOf({"IDS_CITY_DE_BERLIN_BERLIN", "IDS_CITY_JP_TOKYO", "IDS_CITY_IN_NEW_DELHI"});
         openPicker();
     }
-    // The names of cities may end in dots.
-    std::vector<std::string> faults() { return faultsOf(without(stage().texts(), "Elm_Genlist")); }
+    // The names of cities may end in dots, but are as high as their letters.
+    std::vector<std::string> faults() {
+        auto faults = faultsOf(without(stage().texts(), "Elm_Genlist"));
+        for (const FoundText& found : stage().texts())
+            if (isTooLow(found))
+                faults.push_back(found.text + " is too low");
+        return faults;
+    }
 
 private:
-    std::unique_ptr<CatalogueLanguage> _language;
+    std::unique_ptr<LiveLanguage> _language;
 };
 
 TEST_P(CitiesLanguageTest, ThePickerIsTranslatedAndFits) {

@@ -1,0 +1,17 @@
+/**
+ * @file
+ * @brief What can be wrong with texts on the face.
+ */
+#pragma once
+
+#include <string>
+#include <vector>
+
+#include "support/Stage.h"
+
+/** True when a line is wider than what can be seen of it. */
+bool isCut(const FoundText& found);
+/** True when lines of a text block are higher than its place. */
+bool isTooLow(const FoundText& found);
+/** Texts without a translation, and texts that do not fit. */
+std::vector<std::string> faultsOf(const std::vector<FoundText>& texts);
