@@ -1,11 +1,14 @@
 #include <algorithm>
 #include <cmath>
 #include <cstring>
+#include <string>
+#include <vector>
 
 #include <dlfcn.h>
 
 #include <Elementary.h>
 
+#include "Index.h"
 #include "ThemeNames.h"
 #include "device/export.h"
 
@@ -16,6 +19,23 @@
 // the column along the rim of the face: each text keeps its height and is moved in from the edge.
 
 namespace {
+
+constexpr const char* ENTRIES_KEY = "device.index.entries";
+
+/** The toolkit does not tell what an index has in it. */
+struct Entries {
+    std::vector<Elm_Object_Item*> items;
+    int place = -1; ///< Of the one that was turned to last.
+};
+
+Entries* entriesOf(const Evas_Object* index) {
+    return index ? static_cast<Entries*>(evas_object_data_get(index, ENTRIES_KEY)) : nullptr;
+}
+
+void indexDeleted(void* entries, Evas*, Evas_Object* index, void*) {
+    evas_object_data_del(index, ENTRIES_KEY);
+    delete static_cast<Entries*>(entries);
+}
 
 /** From the rim to the middle of a label, and half of a label. */
 constexpr double RIM = 16;
@@ -76,6 +96,27 @@ void labelAdded(void*, Evas_Object*, void* place) {
 
 } // namespace
 
+bool host::turnIndex(Evas_Object* index, int steps) {
+    Entries* entries = entriesOf(index);
+    if (!entries || entries->items.empty())
+        return false;
+    const int last = static_cast<int>(entries->items.size()) - 1;
+    entries->place = std::clamp(entries->place + steps, 0, last);
+    // Selecting raises what a finger raises.
+    elm_index_item_selected_set(entries->items[static_cast<std::size_t>(entries->place)],
+                                EINA_TRUE);
+    return true;
+}
+
+std::string host::indexText(const Evas_Object* index) {
+    const Entries* entries = entriesOf(index);
+    if (!entries || entries->items.empty())
+        return "";
+    const auto place = static_cast<std::size_t>(std::max(entries->place, 0));
+    const char* letter = elm_index_item_letter_get(entries->items[place]);
+    return letter ? letter : "";
+}
+
 DEVICE_EXTERN_C_BEGIN
 
 DEVICE_API Evas_Object* elm_index_add(Evas_Object* parent) {
@@ -85,6 +126,9 @@ DEVICE_API Evas_Object* elm_index_add(Evas_Object* parent) {
         LOG_ERROR("An index needs a parent");
         return nullptr;
     }
+    auto* entries = new Entries;
+    evas_object_data_set(index, ENTRIES_KEY, entries);
+    evas_object_event_callback_add(index, EVAS_CALLBACK_DEL, indexDeleted, entries);
     // More hours than fit: those between two labels are reached by moving the finger.
     elm_index_omit_enabled_set(index, EINA_TRUE);
     Evas_Object* labels =
@@ -94,6 +138,25 @@ DEVICE_API Evas_Object* elm_index_add(Evas_Object* parent) {
     else
         LOG_ERROR("The theme has no place for the labels of an index");
     return index;
+}
+
+DEVICE_API Elm_Object_Item* elm_index_item_append(Evas_Object* obj, const char* letter,
+                                                  Evas_Smart_Cb func, const void* data) {
+    static const auto stock = reinterpret_cast<decltype(&elm_index_item_append)>(
+        dlsym(RTLD_NEXT, "elm_index_item_append"));
+    Elm_Object_Item* item = stock && obj ? stock(obj, letter, func, data) : nullptr;
+    if (Entries* entries = item ? entriesOf(obj) : nullptr)
+        entries->items.push_back(item);
+    return item;
+}
+
+DEVICE_API void elm_index_item_clear(Evas_Object* obj) {
+    static const auto stock =
+        reinterpret_cast<decltype(&elm_index_item_clear)>(dlsym(RTLD_NEXT, "elm_index_item_clear"));
+    if (Entries* entries = entriesOf(obj))
+        *entries = {};
+    if (stock && obj)
+        stock(obj);
 }
 
 DEVICE_EXTERN_C_END

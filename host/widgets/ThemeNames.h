@@ -54,4 +54,24 @@ inline constexpr const char* PART_INDEX_LABEL = "elm.text";
 /** A float: how far a label is moved in from the edge, as a share of its way. */
 inline constexpr int MESSAGE_INDENT = 1;
 
+/** Where a list has its rows. */
+inline constexpr const char* PART_LIST_ROWS = "elm.swallow.content";
+/** Names the parts of a row that must not be cut by the rim, in the theme's data. */
+inline constexpr const char* DATA_RIM = "rim";
+/** A float: how far the upper end of a list is softened, 0 to 1. */
+inline constexpr int MESSAGE_FADE = 1;
+
+/** Where a finger takes hold of an index, and what it says in the middle. */
+inline constexpr const char* PART_INDEX_TOUCH = "elm.swallow.event.0";
+inline constexpr const char* PART_INDEX_SAID = "elm.text";
+/** The days of a calendar. */
+inline constexpr const char* PART_CALENDAR_WEEKS = "weeks";
+
+/** To what keys have reached, from "elm"; and while steps change its value, from "device". */
+inline constexpr const char* SIGNAL_RING_SHOW = "elm,action,focus_highlight,show";
+inline constexpr const char* SIGNAL_RING_HIDE = "elm,action,focus_highlight,hide";
+inline constexpr const char* SIGNAL_TURNING = "device,state,turning";
+inline constexpr const char* SIGNAL_RESTING = "device,state,resting";
+inline constexpr const char* TOOLKIT_SOURCE = "elm";
+
 } // namespace host::theme

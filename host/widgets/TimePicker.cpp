@@ -67,9 +67,9 @@ bool TimePicker::addWheels() {
         elm_object_part_content_set(_object, part, (*wheel)->object());
         (*wheel)->setChanged([this] { turned(); });
     }
-    _hour->setFocusMoved([this](int direction) { return moveFocus(0, direction); });
-    _minute->setFocusMoved([this](int direction) { return moveFocus(1, direction); });
-    _half->setFocusMoved([this](int direction) { return moveFocus(2, direction); });
+    _hour->setFocusMoved([this](int direction) { return moveFocus(_hour.get(), direction); });
+    _minute->setFocusMoved([this](int direction) { return moveFocus(_minute.get(), direction); });
+    _half->setFocusMoved([this](int direction) { return moveFocus(_half.get(), direction); });
     return true;
 }
 
@@ -164,14 +164,19 @@ void TimePicker::turned() {
     evas_object_smart_callback_call(_object, "changed", nullptr);
 }
 
-bool TimePicker::moveFocus(int from, int direction) {
-    std::vector<std::pair<int, TimeWheel*>> order = {{0, _hour.get()}, {1, _minute.get()}};
+std::vector<TimeWheel*> TimePicker::wheels() const {
+    std::vector<TimeWheel*> order = {_hour.get(), _minute.get()};
     if (!_is24Hours)
-        order.insert(_halfFirst ? order.begin() : order.end(), {2, _half.get()});
+        order.insert(_halfFirst ? order.begin() : order.end(), _half.get());
+    return order;
+}
+
+bool TimePicker::moveFocus(const TimeWheel* from, int direction) const {
+    const std::vector<TimeWheel*> order = wheels();
     for (std::size_t i = 0; i < order.size(); ++i) {
         const std::size_t to = i + static_cast<std::size_t>(direction);
-        if (order[i].first == from && to < order.size()) {
-            elm_object_focus_set(order[to].second->object(), EINA_TRUE);
+        if (order[i] == from && to < order.size()) {
+            elm_object_focus_set(order[to]->object(), EINA_TRUE);
             return true;
         }
     }

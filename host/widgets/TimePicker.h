@@ -8,6 +8,7 @@
 #include <ctime>
 #include <memory>
 #include <string>
+#include <vector>
 
 #include <Elementary.h>
 
@@ -42,6 +43,12 @@ public:
     const char* format() const;
     void setLocale(const char* locale, bool is24Hours);
     bool is24Hours() const { return _is24Hours; }
+    /** Its wheels from left to right. */
+    std::vector<TimeWheel*> wheels() const;
+    const TimeWheel* hourWheel() const { return _hour.get(); }
+    const TimeWheel* minuteWheel() const { return _minute.get(); }
+    /** Hidden with 24 hours. */
+    const TimeWheel* halfWheel() const { return _half.get(); }
 
 private:
     explicit TimePicker(Evas_Object* object);
@@ -54,7 +61,7 @@ private:
     void placeHalf();
     void showTime();
     void turned();
-    bool moveFocus(int from, int direction);
+    bool moveFocus(const TimeWheel* from, int direction) const;
 
     Evas_Object* _object;
     std::unique_ptr<TimeWheel> _hour;

@@ -7,6 +7,8 @@
 
 #include <Edje.h>
 
+#include "../Motion.h"
+#include "Accessible.h"
 #include "ThemeNames.h"
 
 #define LOG_TAG "device-host"
@@ -20,6 +22,7 @@ namespace {
 constexpr int DRAWN_VALUES = 5;
 
 constexpr const char* WHEEL_KEY = "device.timewheel";
+constexpr const char* OBJECT_KEY = "device.timewheel.object";
 
 /** A plain container: its members share one clip and move with it. */
 Evas_Object* addContainer(Evas* canvas, void (*calculate)(Evas_Object*)) {
@@ -54,7 +57,12 @@ std::unique_ptr<TimeWheel> TimeWheel::create(Evas_Object* parent) {
     return wheel;
 }
 
+TimeWheel* TimeWheel::of(const Evas_Object* object) {
+    return object ? static_cast<TimeWheel*>(evas_object_data_get(object, OBJECT_KEY)) : nullptr;
+}
+
 TimeWheel::TimeWheel(Evas_Object* object) : _object(object) {
+    evas_object_data_set(_object, OBJECT_KEY, this);
     evas_object_event_callback_add(_object, EVAS_CALLBACK_DEL, _deletedCb, this);
 }
 
@@ -63,6 +71,7 @@ TimeWheel::~TimeWheel() {
     if (!_object)
         return;
     endPress();
+    evas_object_data_del(_object, OBJECT_KEY);
     evas_object_event_callback_del_full(_object, EVAS_CALLBACK_DEL, _deletedCb, this);
     evas_object_event_callback_del_full(_object, EVAS_CALLBACK_MOUSE_DOWN, _mouseDownCb, this);
     evas_object_event_callback_del_full(_object, EVAS_CALLBACK_MOUSE_MOVE, _mouseMoveCb, this);
@@ -108,6 +117,7 @@ void TimeWheel::dropValueObjects() {
 
 void TimeWheel::listen() {
     elm_object_focus_allow_set(_object, EINA_TRUE);
+    setReadAsSpinner(_object);
     evas_object_event_callback_add(_object, EVAS_CALLBACK_MOUSE_DOWN, _mouseDownCb, this);
     evas_object_event_callback_add(_object, EVAS_CALLBACK_MOUSE_MOVE, _mouseMoveCb, this);
     evas_object_event_callback_add(_object, EVAS_CALLBACK_MOUSE_UP, _mouseUpCb, this);
@@ -219,7 +229,8 @@ void TimeWheel::tapped(int y) {
 void TimeWheel::_mouseWheelCb(void* data, Evas*, Evas_Object*, void* info) {
     auto* event = static_cast<Evas_Event_Mouse_Wheel*>(info);
     auto* wheel = static_cast<TimeWheel*>(data);
-    if (event->direction != 0 || event->z == 0 || elm_object_disabled_get(wheel->_object))
+    if (event->direction != 0 || event->z == 0 || (event->event_flags & EVAS_EVENT_FLAG_ON_HOLD) ||
+        elm_object_disabled_get(wheel->_object))
         return;
     event->event_flags =
         static_cast<Evas_Event_Flags>(event->event_flags | EVAS_EVENT_FLAG_ON_HOLD);
@@ -293,6 +304,11 @@ void TimeWheel::glideTo(long to, double speed) {
     if (_position == static_cast<double>(to))
         return;
     _glide = glideFrom(_position, to, speed, ecore_loop_time_get());
+    if (!isMotionOn()) {
+        _glide->duration = 0;
+        _frameCb(this);
+        return;
+    }
     if (!_animator)
         _animator = ecore_animator_add(_frameCb, this);
 }
@@ -409,7 +425,7 @@ void TimeWheel::describe() {
     if (!_object || _name.empty() || count() == 0)
         return;
     const std::string& text = _values.texts[static_cast<std::size_t>(value())];
-    elm_access_info_set(_object, ELM_ACCESS_INFO, (_name + " " + text).c_str());
+    setReadName(_object, _name + ", " + text);
 }
 
 void TimeWheel::_areaResizedCb(void*, Evas*, Evas_Object* area, void*) {
@@ -420,6 +436,7 @@ void TimeWheel::_deletedCb(void* data, Evas*, Evas_Object*, void*) {
     auto* wheel = static_cast<TimeWheel*>(data);
     wheel->endPress();
     wheel->stop();
+    evas_object_data_del(wheel->_object, OBJECT_KEY);
     if (wheel->_area)
         evas_object_data_del(wheel->_area, WHEEL_KEY);
     wheel->_object = nullptr;

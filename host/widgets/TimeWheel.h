@@ -21,8 +21,9 @@ namespace host {
  * @brief A column of values that a person turns.
  *
  * It follows a finger pixel by pixel, runs on after a flick and always comes to rest on a value.
- * The mouse wheel, the up and down keys and a tap on a neighbour step by one value; Up goes to the
- * value drawn above. It draws nothing and runs nothing while it stands still.
+ * The mouse wheel, where nothing else takes it, the up and down keys and a tap on a neighbour step
+ * by one value; Up goes to the value drawn above. It draws nothing and runs nothing while it stands
+ * still.
  */
 class TimeWheel {
 public:
@@ -34,6 +35,8 @@ public:
 
     /** @return Null when the theme has no wheel. */
     static std::unique_ptr<TimeWheel> create(Evas_Object* parent);
+    /** The wheel of a widget; null for any other object. */
+    static TimeWheel* of(const Evas_Object* object);
     ~TimeWheel();
     TimeWheel(const TimeWheel&) = delete;
     TimeWheel& operator=(const TimeWheel&) = delete;
@@ -44,6 +47,12 @@ public:
     /** Stands on a value, without motion and without telling anyone. */
     void setValue(int index);
     int value() const;
+    /** Glides on by some values, as far as there are any. */
+    void step(int values);
+    /** What can be turned to. */
+    const Values& values() const { return _values; }
+    /** Pixels from one value to the next. */
+    int stepHeight() const { return _stepHeight; }
     /**
      * @brief Sets who hears of each value that a person lands on or passes.
      *
@@ -92,7 +101,6 @@ private:
     /** True when the value in the middle is within every view around it. */
     bool isInSight() const;
     bool keyPressed(const std::string& key);
-    void step(int values);
     void glideTo(long to, double speed);
     void stop();
     void endPress();

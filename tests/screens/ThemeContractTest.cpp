@@ -1,7 +1,10 @@
 #include <algorithm>
 #include <fstream>
 #include <iterator>
+#include <regex>
+#include <set>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include <Edje.h>
@@ -18,6 +21,7 @@ const std::string DEVICE = "device.edj";
 const std::string ROWS = "AlarmCustomTheme.edj";
 const std::string EDITOR = "AlarmEditViewController.edj";
 const std::string CITIES = "WorldClockAddCityViewController.edj";
+const std::string SIMULATOR = "simulator.edj";
 
 std::string pathOf(const std::string& file) {
     return std::string(CLOCK_RESOURCE_DIR "/edje/") + file;
@@ -226,6 +230,61 @@ TEST_F(ThemeContractTest, TheContractIsWrittenForEveryGroup) {
             EXPECT_NE(text.find("`" + part + "`"), std::string::npos) << group << ": " << part;
         }
     }
+}
+
+/** As docs/THEME.md writes a group: one name for both kinds of lists, and for every side and style
+ * of a popup. */
+std::string documentedName(std::string group) {
+    static const std::pair<std::regex, const char*> rules[] = {
+        {std::regex("genlist/item_compress/"), "genlist/item/"},
+        {std::regex("elm/notify/(?!block_events)\\w+/popup/.*"), "elm/notify/SIDE/popup/default"},
+        {std::regex("(elm/popup/(?:content|buttons\\d)/popup|elm/notify/block_events/popup|"
+                    "elm/label/base/popup)/.*"),
+         "$1/default"},
+        {std::regex("elm/button/base/popup/default"), "elm/button/base/popup"},
+    };
+    for (const auto& [form, name] : rules)
+        group = std::regex_replace(group, form, name);
+    return group;
+}
+
+std::string themePage() {
+    std::ifstream file(CLOCK_SOURCE_DIR "/docs/THEME.md");
+    return {std::istreambuf_iterator<char>(file), {}};
+}
+
+/** The simulator's control panel is no part of a watch. */
+bool isBesideTheFace(const std::string& group) {
+    return group.find("control") != std::string::npos || group == "simulator/haptic";
+}
+
+TEST_F(ThemeContractTest, EveryGroupIsDocumented) {
+    const std::string page = themePage();
+    for (const std::string& file : {DEVICE, ROWS, EDITOR, CITIES, SIMULATOR}) {
+        for (const std::string& group : groupsOf(file)) {
+            if (!isBesideTheFace(group)) {
+                EXPECT_NE(page.find("`" + documentedName(group) + "`"), std::string::npos) << group;
+            }
+        }
+    }
+}
+
+TEST_F(ThemeContractTest, EveryDocumentedGroupExists) {
+    std::set<std::string> groups;
+    for (const std::string& file : {DEVICE, ROWS, EDITOR, CITIES, SIMULATOR}) {
+        for (const std::string& group : groupsOf(file))
+            groups.insert({group, documentedName(group)});
+    }
+    // A word in capitals stands for several, and a slash at the end for what begins so.
+    static const std::regex form("`((?:elm|device|simulator)/[^`A-Z]*[^`A-Z/])`");
+    const std::string page = themePage();
+    std::size_t count = 0;
+    for (std::sregex_iterator match(page.begin(), page.end(), form), end; match != end; ++match) {
+        const std::string name = (*match)[1];
+        EXPECT_TRUE(groups.contains(name) || name.ends_with(".edc")) << name;
+        ++count;
+    }
+    EXPECT_GT(count, 40U);
 }
 
 TEST_F(ThemeContractTest, TheColoursThatCodeNamesAreInTheTheme) {

@@ -46,23 +46,33 @@ std::uint32_t pixelAt(const Picture& picture, int x, int y) {
                           static_cast<std::size_t>(x)];
 }
 
+/** What a channel may be half a pixel around a place. */
+struct Span {
+    int least = 255;
+    int most = 0;
+};
+
+Span spanAround(const Picture& picture, int x, int y, int shift) {
+    const int middle = channel(pixelAt(picture, x, y), shift);
+    Span span;
+    for (int row = std::max(0, y - 1); row <= std::min(picture.height - 1, y + 1); ++row) {
+        for (int column = std::max(0, x - 1); column <= std::min(picture.width - 1, x + 1);
+             ++column) {
+            const int between = (middle + channel(pixelAt(picture, column, row), shift)) / 2;
+            span.least = std::min(span.least, between);
+            span.most = std::max(span.most, between);
+        }
+    }
+    return span;
+}
+
 /** True when a pixel of one picture is no mix of what another has around the same place. */
 bool isUnlike(std::uint32_t pixel, const Picture& other, int x, int y, int tolerance) {
     for (const int shift : {0, 8, 16}) {
-        int least = 255;
-        int most = 0;
-        for (int row = std::max(0, y - 1); row <= std::min(other.height - 1, y + 1); ++row) {
-            for (int column = std::max(0, x - 1); column <= std::min(other.width - 1, x + 1);
-                 ++column) {
-                const int value = channel(pixelAt(other, column, row), shift);
-                least = std::min(least, value);
-                most = std::max(most, value);
-            }
-        }
+        const Span span = spanAround(other, x, y, shift);
         const int value = channel(pixel, shift);
-        if (value < least - tolerance || value > most + tolerance) {
+        if (value < span.least - tolerance || value > span.most + tolerance)
             return true;
-        }
     }
     return false;
 }
@@ -70,8 +80,7 @@ bool isUnlike(std::uint32_t pixel, const Picture& other, int x, int y, int toler
 bool differs(const Picture& a, const Picture& b, int x, int y, int tolerance) {
     const std::uint32_t one = pixelAt(a, x, y);
     const std::uint32_t other = pixelAt(b, x, y);
-    return one != other &&
-           (isUnlike(one, b, x, y, tolerance) || isUnlike(other, a, x, y, tolerance));
+    return one != other && isUnlike(one, b, x, y, tolerance) && isUnlike(other, a, x, y, tolerance);
 }
 
 } // namespace

@@ -20,6 +20,11 @@ struct Picture {
     static Picture load(const std::string& path);
 };
 
+/** Greatest difference of a channel between approved pictures and what is drawn. */
+inline constexpr int PICTURE_TOLERANCE = 24;
+/** Greatest part of their pixels that may differ: less than a short word that has moved. */
+inline constexpr double PICTURE_FRACTION = 0.0004;
+
 /** What comparePictures() found. */
 struct PictureDifference {
     double fraction = 1; ///< Part of the pixels that differ; 1 when the sizes do.
@@ -30,8 +35,8 @@ struct PictureDifference {
  * @brief Compares as the eye does, not bit by bit.
  *
  * Another version of the font rasteriser moves edges by a part of a pixel: a pixel counts as equal
- * when it lies between the colours that the other picture has there and next to it, and the other
- * way round.
+ * when it lies between the colours that the other picture has half a pixel around the same place,
+ * or the other way round. What has moved by a pixel is unlike.
  * @param tolerance Greatest difference of a channel that counts as equal.
  */
 PictureDifference comparePictures(const Picture& actual, const Picture& approved, int tolerance);

@@ -41,6 +41,15 @@ bool looksLikePath(const fs::path& root, const std::string& text) {
     return std::regex_match(text, file);
 }
 
+/** Groups of themes look like paths. */
+bool isThemeGroup(const fs::path& root, const std::string& text) {
+    const auto files = filesOf(root);
+    return std::any_of(files.begin(), files.end(), [&](const std::string& file) {
+        return file.ends_with(".edc") &&
+               contentsOf(root / file).find('"' + text + '"') != std::string::npos;
+    });
+}
+
 /** A bare file name may be that of a file anywhere. */
 bool exists(const fs::path& root, const std::string& document, const std::string& path) {
     if (fs::exists(root / path) || fs::exists(root / fs::path(document).parent_path() / path))
@@ -62,7 +71,8 @@ std::vector<std::string> missingFiles(const fs::path& root) {
         const std::string text = contentsOf(root / document);
         const std::string prefix = document + ": ";
         for (const auto& path : allMatches(text, quoted)) {
-            if (looksLikePath(root, path) && !exists(root, document, path))
+            if (looksLikePath(root, path) && !exists(root, document, path) &&
+                !isThemeGroup(root, path))
                 missing.push_back(prefix + path);
         }
         for (const auto& path : allMatches(text, linked)) {
@@ -82,8 +92,10 @@ TEST(Documents, NameFilesThatExist) {
 TEST(Documents, ANameWithoutAFileIsFound) {
     const PlantedTree tree;
     tree.plant("src/A.cpp", "");
-    tree.plant("docs/HOW.md",
-               "`src/A.cpp`, `src/B.cpp`, `db/setting/psmode`, `src/*.cpp`, [t](T.md)");
+    tree.plant("src/page.edc", "group { name: \"src/page/top\"; }");
+    tree.plant(
+        "docs/HOW.md",
+        "`src/A.cpp`, `src/page/top`, `src/B.cpp`, `db/setting/psmode`, `src/*.cpp`, [t](T.md)");
     tree.plant("README.md", "[how](docs/HOW.md#start) [web](https://example.org/x.md) `docs/NO.md` "
                             "`build/dev/bin/x` `./run` `GONE.md` `HOW.md`");
     EXPECT_THAT(missingFiles(tree.root()),

@@ -1,0 +1,35 @@
+/**
+ * @file
+ * @brief What is drawn on the face, and where: shrunk rows, faded popups and all.
+ */
+#pragma once
+
+#include <string>
+#include <vector>
+
+#include <Evas.h>
+
+/** A rectangle on the face; a shrunk row has no whole pixels. */
+struct InkArea {
+    double x = 0;
+    double y = 0;
+    double width = 0;
+    double height = 0;
+    /** The distance of its farthest corner from the middle of the face. */
+    double reach() const;
+};
+
+/** A line of text, or an image, as far as it can be seen. */
+struct Ink {
+    std::string what; ///< The text, or the file of the image.
+    Evas_Object* object = nullptr;
+    InkArea area;
+    double opacity = 1; ///< 0..1
+    bool isText = false;
+};
+
+/** Everything drawn on a canvas that is not covered altogether. */
+std::vector<Ink> inkOf(const Evas* canvas);
+
+/** Where a rectangle of an object is drawn: maps of what it is part of move and shrink it. */
+InkArea drawnArea(const Evas_Object* object, InkArea area);
