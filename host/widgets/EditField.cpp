@@ -1,5 +1,6 @@
 #include "EditField.h"
 
+#include "Accessible.h"
 #include "ThemeNames.h"
 
 #define LOG_TAG "device-host"
@@ -61,6 +62,7 @@ Evas_Object* addClearButton(Evas_Object* field) {
     Evas_Object* button = elm_button_add(field);
     elm_object_style_set(button, theme::STYLE_CLEAR_BUTTON);
     elm_object_focus_allow_set(button, EINA_FALSE);
+    setReadTextId(button, "IDS_ACC_BODY_CLEAR");
     evas_object_smart_callback_add(button, "clicked", clearClicked, field);
     return button;
 }

@@ -11,6 +11,8 @@
 #include <Ecore_Input.h>
 #include <Elementary.h>
 
+#include "BackKey.h"
+#include "FocusNavigator.h"
 #include "device_host.h"
 
 #define LOG_TAG "device-host"
@@ -60,9 +62,18 @@ bool isShown(const Evas_Object* object) {
     return true;
 }
 
-bool isInWindow(const Evas_Object* object, Ecore_Window window) {
+Ecore_Window windowOf(const Evas_Object* object) {
     Ecore_Evas* evas = ecore_evas_ecore_evas_get(evas_object_evas_get(object));
-    return evas && ecore_evas_window_get(evas) == window;
+    return evas ? ecore_evas_window_get(evas) : 0;
+}
+
+/** The one that a back key in a window is for; null for none. */
+const Listener* listenerIn(Ecore_Window window) {
+    const auto& all = listeners();
+    const auto found = std::find_if(all.rbegin(), all.rend(), [window](const Listener& listener) {
+        return windowOf(listener.object) == window && isShown(listener.object);
+    });
+    return found == all.rend() ? nullptr : &*found;
 }
 
 /** The toolkit's own page stack pops on a press of Escape; the device's back key is the release. */
@@ -75,11 +86,8 @@ Eina_Bool keyReleased(void*, int, void* info) {
     const auto* event = static_cast<Ecore_Event_Key*>(info);
     if (!isBackKey(event->keyname))
         return ECORE_CALLBACK_PASS_ON;
-    const auto& all = listeners();
-    const auto found = std::find_if(all.rbegin(), all.rend(), [event](const Listener& listener) {
-        return isInWindow(listener.object, event->event_window) && isShown(listener.object);
-    });
-    if (found == all.rend())
+    const Listener* found = listenerIn(event->event_window);
+    if (!found || host::FocusNavigator::stopTurning(found->object))
         return ECORE_CALLBACK_PASS_ON;
     // A copy: the callback may add and remove listeners.
     const Listener listener = *found;
@@ -149,6 +157,11 @@ void windowDeleted(void*, Evas*, Evas_Object* window, void*) {
 }
 
 } // namespace
+
+Evas_Object* host::backKeyObject(const Evas_Object* window) {
+    const Listener* found = window ? listenerIn(windowOf(window)) : nullptr;
+    return found ? found->object : nullptr;
+}
 
 void eext_object_event_callback_add(Evas_Object* obj, eext_event_type_e type,
                                     eext_event_cb callback, void* data) {

@@ -17,6 +17,8 @@
 #include <app_assist/WNaviframeController.h>
 #include <app_assist/WWindowController.h>
 
+#include "support/Picture.h"
+
 namespace app_assist {
 class WContentViewController;
 }
@@ -108,11 +110,18 @@ public:
     /** Turns the wheel; positive = down. */
     void wheel(int x, int y, int steps);
 
+    /** Turns the bezel by some detents; positive = clockwise. Waits until nothing moves. */
+    void bezel(int steps);
+    /** Presses the bezel's wheel. Waits until nothing moves. */
+    void pressBezel();
+
     // Keys. Each reaches the toolkit's key handlers and the focused widget, as from a keyboard.
 
     void key(const std::string& name);
     void keyDown(const std::string& name);
     void keyUp(const std::string& name);
+    /** A key, and the time until nothing moves. */
+    void keySettled(const std::string& name);
     /** Types text; UTF-8. */
     void type(const std::string& text);
     void backKey() { key("XF86Back"); }
@@ -145,9 +154,12 @@ public:
      * @param tolerance Greatest difference of a channel that counts as equal.
      * @param fraction Greatest part of the pixels that may differ.
      */
-    void expectPicture(const std::string& name, int tolerance = 24, double fraction = 0.002);
+    void expectPicture(const std::string& name, int tolerance = PICTURE_TOLERANCE,
+                       double fraction = PICTURE_FRACTION);
     /** Colour at a place as 0xAARRGGBB. */
     unsigned pixel(int x, int y);
+    /** The colours of a rectangle, row by row. */
+    std::vector<unsigned> pixels(int x, int y, int width, int height);
 
 private:
     void feedMove(int x, int y);

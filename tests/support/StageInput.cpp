@@ -146,6 +146,29 @@ void Stage::wheel(int x, int y, int steps) {
     }
 }
 
+void Stage::bezel(int steps) {
+    for (int i = 0; i < std::abs(steps); ++i) {
+        wheel(SIZE / 2, SIZE / 2, steps < 0 ? -1 : 1);
+        settle();
+    }
+}
+
+void Stage::pressBezel() {
+    evas_event_feed_mouse_in(canvas(), stamp(), nullptr);
+    feedMove(SIZE / 2, SIZE / 2);
+    evas_event_feed_mouse_down(canvas(), 2, EVAS_BUTTON_NONE, stamp(), nullptr);
+    frames(1);
+    if (window() != nullptr) {
+        evas_event_feed_mouse_up(canvas(), 2, EVAS_BUTTON_NONE, stamp(), nullptr);
+    }
+    settle();
+}
+
+void Stage::keySettled(const std::string& name) {
+    key(name);
+    settle();
+}
+
 void Stage::key(const std::string& name) {
     keyDown(name);
     keyUp(name);

@@ -1,6 +1,7 @@
 #include "support/Stage.h"
 
 #include <algorithm>
+#include <cmath>
 #include <cstdlib>
 #include <filesystem>
 #include <functional>
@@ -10,6 +11,7 @@
 #include <Ecore_Evas.h>
 #include <gtest/gtest.h>
 
+#include "support/FaceInk.h"
 #include "support/Picture.h"
 
 namespace {
@@ -64,10 +66,16 @@ std::string drawnText(Evas_Object* object) {
     return text;
 }
 
+/** Where it is drawn: rows shrink near the rim. */
 Area geometry(const Evas_Object* object) {
-    Area result;
-    evas_object_geometry_get(object, &result.x, &result.y, &result.width, &result.height);
-    return result;
+    Area plain;
+    evas_object_geometry_get(object, &plain.x, &plain.y, &plain.width, &plain.height);
+    const InkArea drawn =
+        drawnArea(object, {1.0 * plain.x, 1.0 * plain.y, 1.0 * plain.width, 1.0 * plain.height});
+    const auto whole = [](double length) {
+        return static_cast<int>(std::lround(length));
+    };
+    return {whole(drawn.x), whole(drawn.y), whole(drawn.width), whole(drawn.height)};
 }
 
 Area intersection(const Area& a, const Area& b) {
@@ -242,4 +250,15 @@ unsigned Stage::pixel(int x, int y) {
     const Picture picture = pictureOf(canvas());
     return picture.pixels.at(static_cast<std::size_t>(y) * static_cast<std::size_t>(picture.width) +
                              static_cast<std::size_t>(x));
+}
+
+std::vector<unsigned> Stage::pixels(int x, int y, int width, int height) {
+    const Picture picture = pictureOf(canvas());
+    std::vector<unsigned> found;
+    for (int row = y; row < y + height; ++row) {
+        const auto begin = static_cast<std::size_t>(row) * static_cast<std::size_t>(picture.width);
+        for (int column = x; column < x + width; ++column)
+            found.push_back(picture.pixels.at(begin + static_cast<std::size_t>(column)));
+    }
+    return found;
 }

@@ -1,0 +1,387 @@
+#include "FocusNavigator.h"
+
+#include <algorithm>
+#include <cstdlib>
+#include <iterator>
+#include <string_view>
+#include <utility>
+#include <vector>
+
+#include <Ecore_Evas.h>
+#include <Ecore_Input.h>
+#include <Elementary.h>
+
+#include "FocusActions.h"
+#include "FocusList.h"
+#include "FocusRing.h"
+
+#define LOG_TAG "device-host"
+#include "base/Log.h"
+
+namespace host {
+
+namespace {
+
+constexpr const char* REALIZED = "realized";
+constexpr const char* HEARD_KEY = "device.focus.heard";
+constexpr int MIDDLE_BUTTON = 2;
+
+struct KeyName {
+    std::string_view name;
+    FocusInput input;
+};
+
+constexpr KeyName KEY_NAMES[] = {
+    {"Tab", FocusInput::Tab},      {"ISO_Left_Tab", FocusInput::BackTab},
+    {"Up", FocusInput::Up},        {"KP_Up", FocusInput::Up},
+    {"Down", FocusInput::Down},    {"KP_Down", FocusInput::Down},
+    {"Left", FocusInput::Left},    {"KP_Left", FocusInput::Left},
+    {"Right", FocusInput::Right},  {"KP_Right", FocusInput::Right},
+    {"Return", FocusInput::Enter}, {"KP_Enter", FocusInput::Enter},
+    {"space", FocusInput::Space},
+};
+
+std::optional<FocusInput> inputOf(const Ecore_Event_Key& event) {
+    const std::string_view name = event.key ? event.key : "";
+    if (name == "Tab" && (event.modifiers & ECORE_EVENT_MODIFIER_SHIFT))
+        return FocusInput::BackTab;
+    const auto* found = std::find_if(std::begin(KEY_NAMES), std::end(KEY_NAMES),
+                                     [name](const KeyName& key) { return key.name == name; });
+    return found == std::end(KEY_NAMES) ? std::nullopt : std::optional(found->input);
+}
+
+bool isBezel(FocusInput input) {
+    return input == FocusInput::StepForth || input == FocusInput::StepBack ||
+           input == FocusInput::Press;
+}
+
+std::vector<FocusNavigator*>& navigators() {
+    static std::vector<FocusNavigator*> all;
+    return all;
+}
+
+Ecore_Event_Handler*& keyHandler() {
+    static Ecore_Event_Handler* handler = nullptr;
+    return handler;
+}
+
+Eina_Bool thawCb(void*, Evas* canvas) {
+    evas_event_thaw(canvas);
+    return EINA_TRUE;
+}
+
+/** What lies below must not answer as well. */
+template <typename Event>
+void hold(Event& event) {
+    event.event_flags = static_cast<Evas_Event_Flags>(event.event_flags | EVAS_EVENT_FLAG_ON_HOLD);
+}
+
+} // namespace
+
+void FocusNavigator::install(Evas_Object* window) {
+    if (!window)
+        return;
+    navigators().push_back(new FocusNavigator(window));
+    if (!keyHandler())
+        keyHandler() = ecore_event_handler_prepend(ECORE_EVENT_KEY_DOWN, _keyDownCb, nullptr);
+}
+
+FocusNavigator::FocusNavigator(Evas_Object* window)
+    : _window(window), _catcher(evas_object_rectangle_add(evas_object_evas_get(window))) {
+    evas_object_color_set(_catcher, 0, 0, 0, 0);
+    evas_object_layer_set(_catcher, EVAS_LAYER_MAX);
+    // Everything goes on to what lies below, unless it is for the focus.
+    evas_object_repeat_events_set(_catcher, EINA_TRUE);
+    evas_object_event_callback_add(_catcher, EVAS_CALLBACK_MOUSE_WHEEL, _wheelCb, this);
+    evas_object_event_callback_add(_catcher, EVAS_CALLBACK_MOUSE_DOWN, _mouseDownCb, this);
+    evas_object_event_callback_add(_catcher, EVAS_CALLBACK_MOUSE_UP, _mouseUpCb, this);
+    evas_object_event_callback_add(_window, EVAS_CALLBACK_RESIZE, _windowResizedCb, this);
+    evas_object_event_callback_add(_window, EVAS_CALLBACK_DEL, _windowDeletedCb, this);
+    evas_object_show(_catcher);
+}
+
+// Pages go with their window, some of them before it: they cannot be touched any more.
+FocusNavigator::~FocusNavigator() {
+    if (_idle)
+        ecore_idle_enterer_del(_idle);
+    std::erase(navigators(), this);
+    if (navigators().empty() && keyHandler())
+        ecore_event_handler_del(std::exchange(keyHandler(), nullptr));
+}
+
+FocusNavigator* FocusNavigator::of(const Evas* canvas) {
+    for (FocusNavigator* navigator : navigators())
+        if (evas_object_evas_get(navigator->_window) == canvas)
+            return navigator;
+    return nullptr;
+}
+
+FocusNavigator* FocusNavigator::ofKeys(Ecore_Window window) {
+    for (FocusNavigator* navigator : navigators()) {
+        const Ecore_Evas* ee = ecore_evas_ecore_evas_get(evas_object_evas_get(navigator->_window));
+        if (ee && ecore_evas_window_get(ee) == window)
+            return navigator;
+    }
+    return nullptr;
+}
+
+bool FocusNavigator::stopTurning(const Evas_Object* object) {
+    FocusNavigator* navigator = of(evas_object_evas_get(object));
+    if (!navigator || !navigator->_turning || !navigator->_idle)
+        return false;
+    navigator->startTurning(false);
+    return true;
+}
+
+void FocusNavigator::_windowDeletedCb(void* data, Evas*, Evas_Object*, void*) {
+    delete static_cast<FocusNavigator*>(data);
+}
+
+void FocusNavigator::_windowResizedCb(void* data, Evas*, Evas_Object* window, void*) {
+    int width = 0;
+    int height = 0;
+    evas_object_geometry_get(window, nullptr, nullptr, &width, &height);
+    evas_object_resize(static_cast<FocusNavigator*>(data)->_catcher, width, height);
+}
+
+void FocusNavigator::_rootDeletedCb(void* data, Evas*, Evas_Object* root, void*) {
+    auto* self = static_cast<FocusNavigator*>(data);
+    // A page may go after the window.
+    if (std::find(navigators().begin(), navigators().end(), self) == navigators().end())
+        return;
+    self->_memories.erase(root);
+    if (self->_root == root) {
+        self->_root = nullptr;
+        self->_turning = false;
+    }
+}
+
+Eina_Bool FocusNavigator::_keyDownCb(void*, int, void* info) {
+    const auto& event = *static_cast<Ecore_Event_Key*>(info);
+    const auto input = inputOf(event);
+    FocusNavigator* navigator = input ? ofKeys(event.event_window) : nullptr;
+    return navigator && navigator->handle(*input) ? ECORE_CALLBACK_DONE : ECORE_CALLBACK_PASS_ON;
+}
+
+void FocusNavigator::_wheelCb(void* data, Evas*, Evas_Object*, void* info) {
+    auto& event = *static_cast<Evas_Event_Mouse_Wheel*>(info);
+    if (event.direction != 0)
+        return;
+    bool handled = false;
+    const FocusInput input = event.z > 0 ? FocusInput::StepForth : FocusInput::StepBack;
+    for (int step = std::abs(event.z); step > 0; --step)
+        handled = static_cast<FocusNavigator*>(data)->handle(input) || handled;
+    if (handled)
+        hold(event);
+}
+
+void FocusNavigator::_mouseDownCb(void* data, Evas*, Evas_Object*, void* info) {
+    auto* self = static_cast<FocusNavigator*>(data);
+    auto& event = *static_cast<Evas_Event_Mouse_Down*>(info);
+    if (event.button == MIDDLE_BUTTON) {
+        hold(event);
+        // A slider would go where the pointer is, whichever button it was.
+        Evas* canvas = evas_object_evas_get(self->_catcher);
+        evas_event_freeze(canvas);
+        evas_post_event_callback_push(canvas, thawCb, nullptr);
+        self->handle(FocusInput::Press);
+    } else {
+        self->lead(false);
+    }
+}
+
+void FocusNavigator::_mouseUpCb(void* data, Evas*, Evas_Object*, void* info) {
+    auto& event = *static_cast<Evas_Event_Mouse_Up*>(info);
+    if (event.button == MIDDLE_BUTTON)
+        hold(event);
+    else
+        static_cast<FocusNavigator*>(data)->touched(event.canvas.x, event.canvas.y);
+}
+
+/** What is turned by hand is what the bezel turns next. */
+void FocusNavigator::touched(int x, int y) {
+    if (!enterPage())
+        return;
+    const auto thing = FocusView(_root).under(x, y);
+    Memory& memory = _memories[_root];
+    memory = {};
+    _turning = thing && canTurn(thing->kind);
+    if (_turning || (thing && thing->kind == FocusKind::Field))
+        memory.thing = thing;
+}
+
+bool FocusNavigator::enterPage() {
+    Evas_Object* root = focusRoot(_window);
+    if (root != _root) {
+        hideRings();
+        _root = root;
+        _turning = false;
+    }
+    if (root && !_memories.contains(root)) {
+        _memories[root];
+        evas_object_event_callback_add(root, EVAS_CALLBACK_DEL, _rootDeletedCb, this);
+    }
+    return root != nullptr;
+}
+
+std::optional<FocusThing> FocusNavigator::found(const FocusView& view) const {
+    const auto& thing = _memories.at(_root).thing;
+    if (!thing)
+        return std::nullopt;
+    const auto same = view.find(*thing);
+    return same ? same : remade(view);
+}
+
+/** A list that is filled anew has other rows in the same places. */
+std::optional<FocusThing> FocusNavigator::remade(const FocusView& view) const {
+    const Memory& memory = _memories.at(_root);
+    return memory.index < 0 ? std::nullopt : view.inRow(memory.index, memory.thing->place);
+}
+
+bool FocusNavigator::handle(FocusInput input) {
+    if (!enterPage())
+        return false;
+    const FocusView view(_root);
+    if (view.empty() || evas_object_freeze_events_get(_root))
+        return false;
+    const auto thing = found(view);
+    FocusState state;
+    if (thing)
+        state.kind = thing->kind;
+    state.turning = _turning;
+    state.mirrored = view.mirrored();
+    state.typing = thing && thing->kind == FocusKind::Field && elm_object_focus_get(thing->object);
+    _endsTyping = state.typing && thing && input == FocusInput::Enter;
+    return act(view, respond(state, input), input);
+}
+
+bool FocusNavigator::act(const FocusView& view, const FocusResponse& response, FocusInput input) {
+    const auto thing = found(view);
+    const bool byKeyboard = !isBezel(input);
+    switch (response.action) {
+    case FocusAction::PassOn:
+        return false;
+    case FocusAction::First:
+        focus(view.first(), byKeyboard);
+        return true;
+    case FocusAction::Last:
+        focus(view.last(), byKeyboard);
+        return true;
+    case FocusAction::Nearest:
+        focus(view.nearest(), byKeyboard);
+        return true;
+    case FocusAction::Next:
+    case FocusAction::Previous: {
+        const auto next = view.beside(*thing, response.action == FocusAction::Next ? 1 : -1);
+        // At an end it stays, but shows where it is.
+        focus(next ? next : thing, byKeyboard);
+        return true;
+    }
+    case FocusAction::Activate:
+        lead(true);
+        activate(*thing);
+        return true;
+    case FocusAction::StartTurning:
+    case FocusAction::StopTurning:
+        lead(true);
+        startTurning(response.action == FocusAction::StartTurning);
+        return true;
+    case FocusAction::StartTyping:
+        lead(true);
+        giveToolkitFocus(*thing);
+        return true;
+    case FocusAction::Turn:
+        lead(true);
+        bringToMiddle(*thing);
+        turn(*thing, response.turn);
+        if (const auto still = enterPage() ? found(FocusView(_root)) : std::nullopt)
+            showRing(*still, _turning);
+        return true;
+    }
+    return false;
+}
+
+void FocusNavigator::focus(const std::optional<FocusThing>& thing, bool byKeyboard) {
+    lead(true);
+    if (!thing)
+        return;
+    Memory& memory = _memories[_root];
+    const auto before = memory.thing ? FocusView(_root).seen(*memory.thing) : std::nullopt;
+    if (before && !isSame(*before, *thing))
+        hideRing(*before);
+    _turning = false;
+    memory.thing = thing;
+    memory.index = thing->item ? elm_genlist_item_index_get(thing->item) - 1 : -1;
+    showRing(*thing, false);
+    bringToMiddle(*thing);
+    // The bezel only passes over a field: the keypad opens when it is pressed. A calendar would
+    // ring a day of its own.
+    const bool keepsKeys = thing->kind == FocusKind::Row || thing->kind == FocusKind::Calendar ||
+                           (thing->kind == FocusKind::Field && !byKeyboard);
+    if (keepsKeys)
+        dropToolkitFocus(_window, FocusView(_root).button());
+    else
+        giveToolkitFocus(*thing);
+    if (thing->list && !evas_object_data_get(thing->list, HEARD_KEY)) {
+        evas_object_data_set(thing->list, HEARD_KEY, thing->list);
+        evas_object_smart_callback_add(thing->list, REALIZED, _rowRealizedCb, nullptr);
+    }
+}
+
+/** A row that is drawn anew has lost its ring. */
+void FocusNavigator::_rowRealizedCb(void*, Evas_Object* list, void* item) {
+    const FocusNavigator* self = of(evas_object_evas_get(list));
+    if (!self || !self->_idle)
+        return;
+    for (const auto& [root, memory] : self->_memories)
+        if (memory.thing && memory.thing->kind == FocusKind::Row && memory.thing->item == item)
+            showRing(*memory.thing, false);
+}
+
+void FocusNavigator::startTurning(bool turning) {
+    _turning = turning;
+    if (const auto thing = found(FocusView(_root)))
+        showRing(*thing, turning);
+}
+
+/** Shows or hides the ring: it is seen only while keys lead. */
+void FocusNavigator::lead(bool keys) {
+    if (keys == (_idle != nullptr))
+        return;
+    if (keys) {
+        _idle = ecore_idle_enterer_add(_idleCb, this);
+        if (const auto thing = enterPage() ? found(FocusView(_root)) : std::nullopt)
+            showRing(*thing, _turning);
+        return;
+    }
+    ecore_idle_enterer_del(std::exchange(_idle, nullptr));
+    hideRings();
+    for (auto& [root, memory] : _memories)
+        memory = {};
+    _turning = false;
+}
+
+/** Only the page that keys are for has a ring. */
+void FocusNavigator::hideRings() const {
+    for (const auto& [root, memory] : _memories)
+        if (const auto thing = memory.thing ? FocusView(root).seen(*memory.thing) : std::nullopt)
+            hideRing(*thing);
+}
+
+/** A page that comes back shows where its focus was. */
+Eina_Bool FocusNavigator::_idleCb(void* data) {
+    auto* self = static_cast<FocusNavigator*>(data);
+    // The field has had its Return by now.
+    if (std::exchange(self->_endsTyping, false) && self->_root)
+        dropToolkitFocus(self->_window, FocusView(self->_root).button());
+    if (focusRoot(self->_window) == self->_root || !self->enterPage())
+        return ECORE_CALLBACK_RENEW;
+    const FocusView view(self->_root);
+    if (const auto thing = self->found(view)) {
+        self->_memories[self->_root].thing = thing;
+        showRing(*thing, false);
+    }
+    return ECORE_CALLBACK_RENEW;
+}
+
+} // namespace host
