@@ -6,6 +6,7 @@
 
 #include <cstdint>
 #include <functional>
+#include <string>
 
 #include <app_assist/WGenlistItem.h>
 #include <clock/ClockAlarmDbData.h>
@@ -42,7 +43,8 @@ protected:
     static Elm_Genlist_Item_Class* newItemClass(Elm_Gen_Item_Text_Get_Cb text,
                                                 Elm_Gen_Item_Content_Get_Cb content);
     /** @brief Makes the switch, in the record's state. */
-    Evas_Object* createSwitch(Evas_Object* genlist, Evas_Smart_Cb changed);
+    Evas_Object* createSwitch(Evas_Object* genlist, Evas_Smart_Cb changed, const char* title,
+                              const std::string& explanation);
     /** @brief Writes the option and turns the switch, with its animation. */
     void setOption(bool on);
     /** @brief Whether the switch, not the record, is on. */

@@ -55,6 +55,12 @@ presentRows(const std::array<app_assist::WGenlistItem*, rules::EDITOR_ROW_COUNT>
     return present;
 }
 
+// Leaves what the row holds beside its texts: a person may just be typing the name.
+void translate(const app_assist::WGenlistItem* row) {
+    if (row)
+        elm_genlist_item_fields_update(row->getElmObjectItem(), "*", ELM_GENLIST_ITEM_FIELD_TEXT);
+}
+
 // One that is on its way out does not count.
 bool isOpen(const app_assist::WWeakPtr<app_assist::WViewController>& controller) {
     return controller && !controller->isDying();
@@ -389,7 +395,7 @@ void AlarmEditViewController::onEvent(ClockEventListener::EventType type) {
         _updateDateText();
         setTitle();
         for (const EditorRow row : TRANSLATED_ROWS)
-            refreshRow(row);
+            translate(rowAt(row));
         refreshTimePicker();
         break;
     case ClockEventListener::PAUSED:

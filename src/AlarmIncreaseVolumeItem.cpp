@@ -34,7 +34,9 @@ Evas_Object* AlarmIncreaseVolumeItem::_getIncreaseVolumeItemIcon(void* data, Eva
     RETURN_IF_NULL(data, nullptr);
     if (std::string_view(part ? part : "") != "elm.icon")
         return nullptr;
-    return static_cast<AlarmIncreaseVolumeItem*>(data)->createSwitch(genlist, _onCheckStateChanged);
+    return static_cast<AlarmIncreaseVolumeItem*>(data)->createSwitch(
+        genlist, _onCheckStateChanged, clockText("IDS_CLOCK_MBODY_INCREASE_VOLUME"),
+        rules::increaseVolumeExplanation());
 }
 
 void AlarmIncreaseVolumeItem::_onCheckStateChanged(void* data, Evas_Object* check, void*) {

@@ -1,6 +1,7 @@
 #define LOG_TAG "alarm-ui-common"
 #include "AlarmRepeatViewController.h"
 
+#include <app_assist/WAccessible.h>
 #include <app_assist/WNaviframeController.h>
 
 #include "AlarmRepeatViewItem.h"
@@ -77,6 +78,7 @@ void AlarmRepeatViewController::onPushed(Elm_Object_Item* naviItem) {
     Evas_Object* back = elm_button_add(getNaviframeController()->getEvasObj());
     elm_object_style_set(back, "naviframe/back_btn/default");
     evas_object_smart_callback_add(back, "clicked", backClickedCb, this);
+    app_assist::setAccessibleTextId(back, "IDS_ACC_BODY_BACK");
     elm_object_item_part_content_set(naviItem, "prev_btn", back);
     elm_object_item_domain_translatable_part_text_set(naviItem, "elm.text.title", nullptr,
                                                       "IDS_CLOCK_BODY_REPEAT_WEEKLY");

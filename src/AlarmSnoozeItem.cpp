@@ -34,7 +34,10 @@ Evas_Object* AlarmSnoozeItem::_getSnoozeItemIcon(void* data, Evas_Object* genlis
     RETURN_IF_NULL(data, nullptr);
     if (std::string_view(part ? part : "") != "elm.icon")
         return nullptr;
-    return static_cast<AlarmSnoozeItem*>(data)->createSwitch(genlist, _onCheckStateChanged);
+    auto* self = static_cast<AlarmSnoozeItem*>(data);
+    const ClockAlarmDbData& alarm = self->alarm();
+    return self->createSwitch(genlist, _onCheckStateChanged, clockText("IDS_ALM_BODY_SNOOZE"),
+                              rules::snoozeExplanation(alarm.snoozeRepeat, alarm.snoozeDuration));
 }
 
 void AlarmSnoozeItem::_onCheckStateChanged(void* data, Evas_Object* check, void*) {

@@ -1,5 +1,7 @@
 #include "AlarmSwitchItem.h"
 
+#include <app_assist/WAccessible.h>
+
 #include "CheckLayout.h"
 
 namespace {
@@ -37,8 +39,10 @@ Elm_Genlist_Item_Class* AlarmSwitchItem::newItemClass(Elm_Gen_Item_Text_Get_Cb t
     return itemClass;
 }
 
-Evas_Object* AlarmSwitchItem::createSwitch(Evas_Object* genlist, Evas_Smart_Cb changed) {
+Evas_Object* AlarmSwitchItem::createSwitch(Evas_Object* genlist, Evas_Smart_Cb changed,
+                                           const char* title, const std::string& explanation) {
     Evas_Object* check = elm_check_add(genlist);
+    app_assist::setAccessibleName(check, std::string(title) + ", " + explanation);
     elm_object_style_set(check, "on&off");
     elm_check_state_set(check, isOn(_alarm.*_option) ? EINA_TRUE : EINA_FALSE);
     evas_object_repeat_events_set(check, EINA_FALSE);

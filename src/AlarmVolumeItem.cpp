@@ -6,7 +6,9 @@
 
 #include <Elementary.h>
 
+#include <app_assist/WAccessible.h>
 #include <clock/ClockSoundPlayer.h>
+#include <clock/ClockText.h>
 
 #include "NullData.h"
 #include "ThemePath.h"
@@ -142,7 +144,11 @@ void AlarmVolumeItem::_volumeSliderUnfocusedCb(void* data, Evas_Object* slider, 
 void AlarmVolumeItem::_updateVolumeIcon(Evas_Object* parent) {
     const std::string path = themePath("edje/AlarmEditViewController.edj");
     const char* group = rules::volumeIconGroup(_alarm.volume, _alarm.type);
+    const std::string name = std::string(clockText("IDS_QP_HEADER_ALARM_VOLUME")) + ", " +
+                             std::to_string(_alarm.volume) + " / " +
+                             std::to_string(static_cast<int>(rules::LOUDEST_LEVEL));
     for (Evas_Object* slider : _sliders.all()) {
+        app_assist::setAccessibleName(slider, name);
         Evas_Object* icon = elm_image_add(parent ? parent : slider);
         if (!path.empty())
             elm_image_file_set(icon, path.c_str(), group);

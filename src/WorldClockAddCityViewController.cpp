@@ -5,6 +5,7 @@
 
 #include <Ecore_IMF.h>
 
+#include <app_assist/WAccessible.h>
 #include <app_assist/WNaviframeController.h>
 #include <base/Log.h>
 #include <base/Text.h>
@@ -128,6 +129,7 @@ void WorldClockAddCityViewController::_createSearchBar(Evas_Object* parent) {
     Evas_Object* location = elm_button_add(layout);
     elm_object_part_content_set(layout, "location.btn", location);
     elm_object_style_set(location, "bg_animated");
+    app_assist::setAccessibleTextId(location, "IDS_ACC_BODY_LOCATION");
     evas_object_smart_callback_add(location, "clicked", _locationBtnClickedCb, this);
 }
 
@@ -150,6 +152,7 @@ void WorldClockAddCityViewController::createSearchEntry(Evas_Object* layout) {
 
 void WorldClockAddCityViewController::setGuideText() {
     const std::string guide = std::string(SEARCH_GLYPH) + " " + clockText("IDS_COM_BODY_SEARCH");
+    app_assist::setAccessibleTextId(_searchEntry, "IDS_COM_BODY_SEARCH");
     elm_object_part_text_set(_searchEntry, "elm.guide",
                              std::string(base::cutUtf8(guide, MAX_GUIDE_BYTES)).c_str());
 }
