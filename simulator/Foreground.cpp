@@ -10,9 +10,13 @@
 
 namespace simulator {
 
+namespace {
+/** Window managers take the focus from one window before they give it to the next. */
+constexpr double FOCUS_MOVES_SECONDS = 0.3;
+} // namespace
+
 Foreground::Foreground(Evas_Object* window) : _window(window) {
-    evas_object_smart_callback_add(window, "focus,in", _focusInCb, this);
-    evas_object_smart_callback_add(window, "focus,out", _focusOutCb, this);
+    listen(window);
     // There is no such event without an X display.
     if (ECORE_X_EVENT_WINDOW_VISIBILITY_CHANGE != 0) {
         _visibility.reset(
@@ -21,20 +25,52 @@ Foreground::Foreground(Evas_Object* window) : _window(window) {
 }
 
 Foreground::~Foreground() {
-    evas_object_smart_callback_del_full(_window, "focus,in", _focusInCb, this);
-    evas_object_smart_callback_del_full(_window, "focus,out", _focusOutCb, this);
+    setCompanion(nullptr);
+    forget(_window);
+}
+
+void Foreground::setCompanion(Evas_Object* window) {
+    if (_companion != nullptr)
+        forget(_companion);
+    _companion = window;
+    if (window != nullptr)
+        listen(window);
+}
+
+void Foreground::listen(Evas_Object* window) {
+    evas_object_smart_callback_add(window, "focus,in", _focusInCb, this);
+    evas_object_smart_callback_add(window, "focus,out", _focusOutCb, this);
+}
+
+void Foreground::forget(Evas_Object* window) {
+    evas_object_smart_callback_del_full(window, "focus,in", _focusInCb, this);
+    evas_object_smart_callback_del_full(window, "focus,out", _focusOutCb, this);
 }
 
 void Foreground::_focusInCb(void* data, Evas_Object*, void*) {
     auto* self = static_cast<Foreground*>(data);
+    self->_leaving.reset();
     self->_unfocused = false;
     self->update();
 }
 
 void Foreground::_focusOutCb(void* data, Evas_Object*, void*) {
     auto* self = static_cast<Foreground*>(data);
+    if (self->_companion != nullptr) {
+        self->_leaving.reset(ecore_timer_add(FOCUS_MOVES_SECONDS, _stillUnfocusedCb, self));
+        return;
+    }
     self->_unfocused = true;
     self->update();
+}
+
+Eina_Bool Foreground::_stillUnfocusedCb(void* data) {
+    auto* self = static_cast<Foreground*>(data);
+    // The main loop deletes the timer of a callback that cancels.
+    static_cast<void>(self->_leaving.release());
+    self->_unfocused = true;
+    self->update();
+    return ECORE_CALLBACK_CANCEL;
 }
 
 Eina_Bool Foreground::_visibilityCb(void* data, int, void* info) {

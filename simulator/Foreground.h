@@ -21,6 +21,9 @@ class Foreground {
 public:
     explicit Foreground(Evas_Object* window);
     ~Foreground();
+    /** @brief Sets a window that a person may use without leaving the application; null for none.
+     */
+    void setCompanion(Evas_Object* window);
     Foreground(const Foreground&) = delete;
     Foreground& operator=(const Foreground&) = delete;
 
@@ -28,12 +31,21 @@ private:
     struct HandlerDeleter {
         void operator()(Ecore_Event_Handler* handler) const { ecore_event_handler_del(handler); }
     };
+    struct TimerDeleter {
+        void operator()(Ecore_Timer* timer) const { ecore_timer_del(timer); }
+    };
+    static Eina_Bool _stillUnfocusedCb(void* data);
+    void listen(Evas_Object* window);
+    void forget(Evas_Object* window);
     static void _focusInCb(void* data, Evas_Object* window, void* info);
     static void _focusOutCb(void* data, Evas_Object* window, void* info);
     static Eina_Bool _visibilityCb(void* data, int type, void* info);
     void update();
 
     Evas_Object* _window;
+    Evas_Object* _companion = nullptr;
+    /** Runs while the focus may be on its way from one window to the other. */
+    std::unique_ptr<Ecore_Timer, TimerDeleter> _leaving;
     bool _unfocused = false; ///< It had the focus and lost it.
     bool _covered = false;
     bool _paused = false;

@@ -6,6 +6,7 @@
 #include <cstring>
 
 #include "Keys.h"
+#include "script/Commands.h"
 
 namespace simulator {
 namespace {
@@ -62,7 +63,30 @@ std::string applyPowerSaving(Options& options, const std::string& value) {
     return "";
 }
 
-constexpr std::array<OptionRow, 13> OPTION_ROWS{{
+std::string applyScript(Options& options, const std::string& value) {
+    options.script = value;
+    return value.empty() ? "needs the name of a file" : "";
+}
+
+std::string applyCommand(Options& options, const std::string& value) {
+    options.commands.push_back(value);
+    return value.empty() ? "needs a command" : "";
+}
+
+/** Keeps a setting for the device, which knows what is wrong with it. */
+template <const char* SETTING>
+std::string applySetting(Options& options, const std::string& value) {
+    options.settings.emplace_back(SETTING, value);
+    return value.empty() ? "needs a value" : "";
+}
+
+constexpr char REGION[] = "region";
+constexpr char TIME_ZONE[] = "time-zone";
+constexpr char CLOCK[] = "clock";
+constexpr char NETWORK[] = "network";
+constexpr char MOTION[] = "motion";
+
+constexpr std::array<OptionRow, 22> OPTION_ROWS{{
     {"--data", "DIR", "keep settings and alarms in DIR",
      [](Options& o, const std::string& v) {
          return applyDirectory(o.dataDir, v);
@@ -80,6 +104,24 @@ constexpr std::array<OptionRow, 13> OPTION_ROWS{{
     {"--24h", nullptr, "set the device to 24 hours",
      [](Options& o, const std::string&) {
          o.twelveHour = false;
+         return std::string();
+     }},
+    {"--region", "LOCALE", "set the device's region, for example de_DE", applySetting<REGION>},
+    {"--time-zone", "NAME", "set the device's time zone, for example Asia/Tokyo",
+     applySetting<TIME_ZONE>},
+    {"--clock", "TIME", "set the device's clock: \"2026-12-31 23:59\", +SECONDS, real",
+     applySetting<CLOCK>},
+    {"--network", "DIGITS", "set the mobile network, for example 26201, or none",
+     applySetting<NETWORK>},
+    {"--motion", "on|off", "set whether things move", applySetting<MOTION>},
+    {"--panel", nullptr, "open the control panel beside the face",
+     [](Options& o, const std::string&) {
+         o.panel = true;
+         return std::string();
+     }},
+    {"--no-panel", nullptr, "open no control panel; as where there is no room for one",
+     [](Options& o, const std::string&) {
+         o.panel = false;
          return std::string();
      }},
     {"--create", nullptr, "open the editor for a new alarm",
@@ -100,6 +142,9 @@ constexpr std::array<OptionRow, 13> OPTION_ROWS{{
      }},
     {"--set-volume", "LEVEL", "set the alarm's volume, 0 to 15, and end", applyVolume},
     {"--power-saving", "on|off", "switch ultra power saving and end", applyPowerSaving},
+    {"--script", "FILE", "run the commands of FILE, and end", applyScript},
+    {"--command", "LINE", "send a command to the watch that runs; - = standard input",
+     applyCommand},
     {"--version", nullptr, "print the version",
      [](Options& o, const std::string&) {
          o.version = true;
@@ -165,6 +210,10 @@ Options parseOptions(const std::vector<std::string>& arguments) {
         options.error = "options '" + opens[0] + "' and '" + opens[1] + "' exclude each other";
     if (options.error.empty() && options.onlySets() && !opens.empty())
         options.error = "the watch does not start to set '--set-volume' or '--power-saving'";
+    if (options.error.empty() && !options.script.empty() &&
+        (options.onlySets() || !options.commands.empty()))
+        options.error = "'--script' needs a watch of its own, without '--set-volume', "
+                        "'--power-saving' and '--command'";
     return options;
 }
 
@@ -180,6 +229,7 @@ std::string helpText() {
         text += "  " + name + row.help + "\n";
     }
     text += "\nKeys:\n" + keysHelpText();
+    text += "\nCommands of --script and --command:\n" + commandsHelpText();
     text +=
         "\nExit status: 0 after a normal end, 1 when the watch cannot start, 2 for a command "
         "line\nthat makes no sense. A watch that runs takes over what another clock-sim sets.\n";

@@ -6,6 +6,7 @@
 
 #include <optional>
 #include <string>
+#include <utility>
 #include <vector>
 
 namespace simulator {
@@ -21,9 +22,15 @@ struct Options {
     std::optional<bool> twelveHour;  ///< Set the device to 12 or to 24 hours.
     std::optional<int> volume;       ///< Set the alarm's level, and no more.
     std::optional<bool> powerSaving; ///< Switch ultra power saving, and no more.
+    std::optional<bool>
+        panel; ///< Open the control panel, or do not; by itself where there is room.
+    std::vector<std::pair<std::string, std::string>> settings; ///< Of the device, by their names.
     std::string dataDir;
     std::string resourceDir;
     std::string language;
+    std::string script;                ///< File of the script to run.
+    std::vector<std::string> commands; ///< For a watch that runs already; "-" = standard input.
+    int channel = -1;  ///< To the process that runs the script; not from the command line.
     std::string error; ///< Why the command line makes no sense; empty when it does.
 
     /** True when only settings are written, for a watch that may be running. */

@@ -1,5 +1,6 @@
 #include "QuickPanel.h"
 
+#include <algorithm>
 #include <utility>
 
 #include <Elementary.h>
@@ -16,7 +17,8 @@ namespace simulator {
 
 namespace {
 constexpr double REFRESH_SECONDS = 0.5;
-}
+constexpr int LOUDEST = 15;
+} // namespace
 
 QuickPanel::QuickPanel(Evas_Object* window, const std::string& theme,
                        std::function<void(bool shown)> changed)
@@ -49,6 +51,7 @@ void QuickPanel::open() {
     _timer.reset(ecore_timer_add(REFRESH_SECONDS, _refreshCb, this));
     // The back key closes the panel, not what lies below it.
     eext_object_event_callback_add(_layout, EEXT_EVENT_BACK, _backCb, this);
+    evas_object_event_callback_add(_layout, EVAS_CALLBACK_MOUSE_WHEEL, _bezelCb, this);
     elm_object_signal_emit(_layout, "panel,show", "simulator");
     _changed(true);
 }
@@ -56,6 +59,7 @@ void QuickPanel::open() {
 void QuickPanel::close() {
     _timer.reset();
     eext_object_event_callback_del(_layout, EEXT_EVENT_BACK, _backCb);
+    evas_object_event_callback_del_full(_layout, EVAS_CALLBACK_MOUSE_WHEEL, _bezelCb, this);
     elm_object_signal_emit(_layout, "panel,hide", "simulator");
     _changed(false);
 }
@@ -70,6 +74,17 @@ void QuickPanel::refresh() {
 Eina_Bool QuickPanel::_refreshCb(void* data) {
     static_cast<QuickPanel*>(data)->refresh();
     return ECORE_CALLBACK_RENEW;
+}
+
+/** There is one thing here to turn. */
+void QuickPanel::_bezelCb(void* data, Evas*, Evas_Object*, void* info) {
+    const auto* event = static_cast<Evas_Event_Mouse_Wheel*>(info);
+    int level = 0;
+    sound_manager_get_volume(SOUND_TYPE_ALARM, &level);
+    level = std::clamp(level + event->z, 0, LOUDEST);
+    if (sound_manager_set_volume(SOUND_TYPE_ALARM, level) != SOUND_MANAGER_ERROR_NONE)
+        LOG_ERROR("The alarm's volume cannot be set to %d", level);
+    static_cast<QuickPanel*>(data)->refresh();
 }
 
 void QuickPanel::_closeCb(void* data, Evas_Object*, const char*, const char*) {

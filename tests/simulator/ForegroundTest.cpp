@@ -97,3 +97,28 @@ TEST_F(ForegroundTest, onceItHasGoneNothingIsRaised) {
     cover(true);
     EXPECT_TRUE(recorder.events.empty());
 }
+
+TEST_F(ForegroundTest, theCompanionsFocusIsThatOfTheApplication) {
+    Evas_Object* companion = elm_win_add(nullptr, "companion", ELM_WIN_BASIC);
+    evas_object_resize(companion, 100, 100);
+    evas_object_show(companion);
+    const auto focusCompanion = [companion](bool has) {
+        evas_object_smart_callback_call(companion, has ? "focus,in" : "focus,out", nullptr);
+    };
+    foreground->setCompanion(companion);
+    focus(true);
+    focus(false);
+    focusCompanion(true);
+    Stage::advance(1);
+    EXPECT_TRUE(recorder.events.empty()) << "the panel is not another application";
+    focusCompanion(false);
+    Stage::advance(1);
+    EXPECT_EQ(recorder.events, Events{PAUSED});
+    focusCompanion(true);
+    EXPECT_EQ(recorder.events, (Events{PAUSED, RESUMED}));
+    foreground->setCompanion(nullptr);
+    evas_object_del(companion);
+    focus(true);
+    focus(false);
+    EXPECT_EQ(recorder.events, (Events{PAUSED, RESUMED, PAUSED})) << "alone again";
+}

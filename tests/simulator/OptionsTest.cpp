@@ -2,7 +2,9 @@
 
 #include "Options.h"
 
+#include <optional>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include <gtest/gtest.h>
@@ -55,4 +57,24 @@ TEST(SimulatorOptions, onePageOpensFirst) {
     EXPECT_EQ(parseOptions({"--pick-city", "--world-clock"}).error,
               "options '--world-clock' and '--pick-city' exclude each other");
     EXPECT_NE(parseOptions({"--set-volume", "3", "--world-clock"}).error, "");
+}
+
+TEST(SimulatorOptions, settingsOfTheDeviceAreTakenInTheirOrder) {
+    using Settings = std::vector<std::pair<std::string, std::string>>;
+    const auto options = parseOptions({"--time-zone", "Asia/Tokyo", "--clock", "-3600",
+                                       "--region=ja_JP", "--network", "none", "--motion=off"});
+    EXPECT_EQ(options.error, "");
+    EXPECT_EQ(options.settings, (Settings{{"time-zone", "Asia/Tokyo"},
+                                          {"clock", "-3600"},
+                                          {"region", "ja_JP"},
+                                          {"network", "none"},
+                                          {"motion", "off"}}));
+    EXPECT_EQ(parseOptions({"--clock="}).error, "option '--clock' needs a value");
+    EXPECT_FALSE(options.onlySets());
+}
+
+TEST(SimulatorOptions, thePanelOpensByItselfOrAsTold) {
+    EXPECT_EQ(parseOptions({}).panel, std::nullopt);
+    EXPECT_EQ(parseOptions({"--panel"}).panel, true);
+    EXPECT_EQ(parseOptions({"--no-panel"}).panel, false);
 }

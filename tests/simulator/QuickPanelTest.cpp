@@ -64,6 +64,15 @@ TEST_F(QuickPanelTest, itGoesUpAgainAndTells) {
     EXPECT_EQ(told, (std::vector{true, false}));
 }
 
+TEST_F(QuickPanelTest, theBezelTurnsTheVolume) {
+    pullDown();
+    stage().bezel(2);
+    EXPECT_TRUE(stage().shows("9"));
+    stage().bezel(-3);
+    EXPECT_TRUE(stage().shows("6"));
+    EXPECT_TRUE(panel->isShown());
+}
+
 TEST_F(QuickPanelTest, aTouchSendsItUp) {
     pullDown();
     stage().tap(180, 260);
