@@ -27,7 +27,19 @@ foreach(folder app_assist clock device)
         PATTERN CityDatabase.h EXCLUDE PATTERN WDeferredDeletion.h EXCLUDE)
 endforeach()
 install(DIRECTORY "${PROJECT_SOURCE_DIR}/host/include/" DESTINATION "${CLOCK_UI_INCLUDE_DIR}" FILES_MATCHING PATTERN "*.h")
-install(DIRECTORY "${CLOCK_RESOURCE_DIR}/" DESTINATION "${CLOCK_UI_RESOURCE_DIR}" PATTERN "simulator.edj" EXCLUDE)
+install(DIRECTORY "${CLOCK_RESOURCE_DIR}/" DESTINATION "${CLOCK_UI_RESOURCE_DIR}")
+
+# The simulator, and the city picker, which is the same program under another name.
+file(RELATIVE_PATH libraries_from_programs "/prefix/${CMAKE_INSTALL_BINDIR}" "/prefix/${CMAKE_INSTALL_LIBDIR}")
+file(RELATIVE_PATH program_from_applications "/prefix/${CMAKE_INSTALL_LIBEXECDIR}/clock-ui" "/prefix/${CMAKE_INSTALL_BINDIR}/clock-sim")
+set_target_properties(clock-sim PROPERTIES INSTALL_RPATH "$ORIGIN/${libraries_from_programs}")
+install(TARGETS clock-sim RUNTIME DESTINATION "${CMAKE_INSTALL_BINDIR}")
+set(city_picker "${PROJECT_BINARY_DIR}/package/com.vendra.clock.city-picker")
+file(MAKE_DIRECTORY "${PROJECT_BINARY_DIR}/package")
+file(CREATE_LINK "${program_from_applications}" "${city_picker}" SYMBOLIC)
+install(FILES "${city_picker}" DESTINATION "${CMAKE_INSTALL_LIBEXECDIR}/clock-ui")
+install(FILES "${PROJECT_SOURCE_DIR}/simulator/clock-sim.desktop" DESTINATION "${CMAKE_INSTALL_DATADIR}/applications")
+install(FILES "${PROJECT_SOURCE_DIR}/simulator/clock-sim.svg" DESTINATION "${CMAKE_INSTALL_DATADIR}/icons/hicolor/scalable/apps")
 
 configure_package_config_file("${PROJECT_SOURCE_DIR}/cmake/clock-ui-config.cmake.in"
     "${PROJECT_BINARY_DIR}/package/clock-ui-config.cmake"

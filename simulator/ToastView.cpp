@@ -5,6 +5,7 @@
 #include <Elementary.h>
 
 #include "WatchFace.h"
+#include "app_assist/WAccessible.h"
 #include "device_host.h"
 
 #define LOG_TAG "clock-sim"
@@ -50,6 +51,7 @@ void ToastView::showNext() {
     char* markup = elm_entry_utf8_to_markup(_waiting.front().c_str());
     elm_object_part_text_set(_layout, "toast.text", markup);
     std::free(markup);
+    app_assist::announce(_layout, _waiting.front());
     _waiting.pop_front();
     elm_object_signal_emit(_layout, "toast,show", "simulator");
     _timer.reset(ecore_timer_add(TOAST_SECONDS, _timeOverCb, this));

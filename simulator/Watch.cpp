@@ -5,6 +5,7 @@
 #include <cstdio>
 #include <cstdlib>
 #include <memory>
+#include <optional>
 #include <vector>
 
 #include <Ecore_X.h>
@@ -17,6 +18,7 @@
 #include "PickCity.h"
 #include "PowerSaving.h"
 #include "QuickPanel.h"
+#include "RemoteControl.h"
 #include "ToastView.h"
 #include "VolumeKeys.h"
 #include "VolumeView.h"
@@ -26,15 +28,23 @@
 #include "clock/ClockAlarmDbModel.h"
 #include "clock/ClockAlarmManagerModel.h"
 #include "clock/ClockEventListener.h"
+#include "control/ControlPanel.h"
+#include "control/DeviceActions.h"
+#include "control/DeviceSettings.h"
 #include "device/app_resource_manager.h"
 #include "device/sound_manager.h"
 #include "device/vconf.h"
+#include "device_app.h"
 #include "device_host.h"
 
 namespace simulator {
 namespace {
 
 constexpr const char* TIME_FORM_KEY = "db/menu_widget/regionformat_time1224";
+constexpr const char* REGION_KEY = "db/menu_widget/regionformat";
+constexpr const char* LANGUAGE_KEY = "db/setting/language";
+constexpr const char* TIME_ZONE_KEY = "db/setting/time_zone";
+constexpr const char* CLOCK_SHIFT_KEY = "db/setting/clock_shift";
 constexpr int TWELVE_HOURS = 1;
 constexpr int TWENTY_FOUR_HOURS = 2;
 
@@ -63,7 +73,7 @@ public:
     /** @return What is wrong; empty when the device stands. */
     std::string start(const Options& options) {
         if (!options.language.empty())
-            setenv("LANGUAGE", options.language.c_str(), 1);
+            setenv("CLOCK_LANGUAGE", options.language.c_str(), 1);
         device_host_config_s config{};
         config.data_dir = orNull(options.dataDir);
         config.resource_dir = orNull(options.resourceDir);
@@ -86,6 +96,13 @@ private:
         const int form = twelveHour ? TWELVE_HOURS : TWENTY_FOUR_HOURS;
         return vconf_set_int(TIME_FORM_KEY, form) == VCONF_OK;
     }
+    /** A watch leaves the factory with a region; screens do not follow the hours without one. */
+    static void setMissingRegion() {
+        char* region = vconf_get_str(REGION_KEY);
+        if (region == nullptr)
+            vconf_set_str(REGION_KEY, "en_US.UTF-8");
+        std::free(region);
+    }
     static std::string writeSettings(const Options& options) {
         if (options.twelveHour && !setTimeForm(*options.twelveHour))
             return "the 12/24-hour setting cannot be written";
@@ -94,6 +111,12 @@ private:
             return "the alarm's volume cannot be written";
         if (options.powerSaving && !setPowerSaving(*options.powerSaving))
             return "the power saving setting cannot be written";
+        setMissingRegion();
+        for (const auto& [setting, value] : options.settings) {
+            std::string problem = setDevice(setting, value);
+            if (!problem.empty())
+                return problem;
+        }
         return "";
     }
 
@@ -138,8 +161,25 @@ void settingChangedCb(keynode_t*, void*) {
     ClockEventListener::raise(ClockEventListener::SETTINGS_CHANGED);
 }
 
+void languageChangedCb(keynode_t*, void*) {
+    ClockEventListener::raise(ClockEventListener::LANGUAGE_CHANGED);
+}
+
+void timeChangedCb(keynode_t*, void*) {
+    ClockEventListener::raise(ClockEventListener::TIME_CHANGED);
+}
+
 void closedCb(void*, Evas_Object*, void*) {
     elm_exit();
+}
+
+/** What the control panel does to the application in front. */
+ControlActions controlActions(QuickPanel& quickPanel) {
+    return {[](const std::string& key, bool down) { down ? pressKey(key) : releaseKey(key); },
+            turnBezel, pressBezel, [&quickPanel] { quickPanel.toggle(); },
+            [](bool background) {
+                background ? goToBackground() : comeToForeground();
+            }};
 }
 
 /** Tells a window about the quick panel, as the system's own window does. */
@@ -157,13 +197,22 @@ void sendQuickPanelState(Evas_Object* window, bool shown) {
 /** What the system draws over the application and does with keys that nobody has taken. */
 class System {
 public:
-    System(Evas_Object* window, const std::string& theme)
+    System(Evas_Object* window, const std::string& theme, std::optional<bool> controls)
         : _toasts(window, theme), _volume(window, theme),
           _panel(window, theme, [window](bool shown) { sendQuickPanelState(window, shown); }),
           _keys([this] { _panel.toggle(); }), _volumeKeys([this](int level) { showVolume(level); }),
           _foreground(window) {
         addBezel(window);
+        setQuickPanel(&_panel);
+        if (controls.value_or(hasRoomForPanel(window)))
+            openControls(window, theme);
     }
+    ~System() {
+        closeControls();
+        setQuickPanel(nullptr);
+    }
+    System(const System&) = delete;
+    System& operator=(const System&) = delete;
 
 private:
     void showVolume(int level) {
@@ -173,12 +222,23 @@ private:
             _volume.show(level);
     }
 
+    void openControls(Evas_Object* window, const std::string& theme) {
+        _controls = std::make_unique<ControlPanel>(window, theme, controlActions(_panel),
+                                                   [this] { closeControls(); });
+        _foreground.setCompanion(_controls->window());
+    }
+    void closeControls() {
+        _foreground.setCompanion(nullptr);
+        _controls.reset();
+    }
+
     ToastView _toasts;
     VolumeView _volume;
     QuickPanel _panel;
     Keys _keys;
     VolumeKeys _volumeKeys;
     Foreground _foreground;
+    std::unique_ptr<ControlPanel> _controls; ///< Null while there is none.
 };
 
 /** A window with pages in it. */
@@ -198,8 +258,8 @@ public:
     app_assist::WWindowController& window() { return _window; }
     void push(app_assist::WContentViewController* page) { _pages->push(page); }
     /** Until the main loop ends. */
-    void run(const std::string& theme) {
-        const System system(_window.getEvasObj(), theme);
+    void run(const std::string& theme, std::optional<bool> controls) {
+        const System system(_window.getEvasObj(), theme, controls);
         evas_object_show(_window.getEvasObj());
         elm_run();
     }
@@ -226,16 +286,26 @@ void showClock(const Options& options, const std::string& theme) {
     auto* alarms = new AlarmListViewController(theme);
     face.push(alarms);
     openFirst(options, *alarms);
-    face.run(theme);
+    const RemoteControl remote(options.channel);
+    face.run(theme, options.channel < 0 ? options.panel : options.panel.value_or(false));
 }
 
-void showCityPicker(const std::string& theme) {
+/** Started by another application it belongs to that one's watch. */
+bool isOwnWatch() {
+    return device_app_launch_request() == nullptr;
+}
+
+void showCityPicker(const Options& options, const std::string& theme) {
     Face face(CITY_PICKER_NAME);
     if (!face.create())
         return;
     attachToCaller(face.window());
     face.push(makeCityPicker());
-    face.run(theme);
+    std::optional<RemoteControl> remote;
+    if (isOwnWatch())
+        remote.emplace(options.channel);
+    // Another application's watch has a panel already.
+    face.run(theme, isOwnWatch() ? options.panel : false);
     detachFromCaller();
 }
 
@@ -260,8 +330,13 @@ int runWatch(const Options& options) {
         return fail("the toolkit cannot be started with the device's theme");
     elm_theme_extension_add(nullptr, theme.c_str());
     vconf_notify_key_changed(TIME_FORM_KEY, settingChangedCb, nullptr);
+    vconf_notify_key_changed(REGION_KEY, settingChangedCb, nullptr);
+    // The device follows it before it tells this.
+    vconf_notify_key_changed(LANGUAGE_KEY, languageChangedCb, nullptr);
+    vconf_notify_key_changed(TIME_ZONE_KEY, timeChangedCb, nullptr);
+    vconf_notify_key_changed(CLOCK_SHIFT_KEY, timeChangedCb, nullptr);
     if (options.pickCity)
-        showCityPicker(theme);
+        showCityPicker(options, theme);
     else
         showClock(options, theme);
     return EXIT_SUCCESS;

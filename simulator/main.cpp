@@ -5,6 +5,7 @@
 #include "PickCity.h"
 #include "Watch.h"
 #include "device_app.h"
+#include "script/ScriptMode.h"
 
 int main(int argc, char** argv) {
     constexpr int USAGE_ERROR = 2;
@@ -26,5 +27,9 @@ int main(int argc, char** argv) {
         std::puts("clock-sim " CLOCK_UI_VERSION);
         return EXIT_SUCCESS;
     }
+    if (!options.commands.empty())
+        return simulator::sendCommands(options);
+    if (!options.script.empty())
+        return simulator::runScript(options, simulator::runWatch);
     return simulator::runWatch(options);
 }

@@ -26,9 +26,20 @@ readme_example() { sed -n '/^<!-- examples\/AlarmEditorExample.cpp -->$/,/^```$/
 
 check "The README shows this example" diff <(readme_example) "$source/examples/AlarmEditorExample.cpp"
 check "The library can be installed" quietly cmake --install "$build" --prefix "$prefix"
-check "No header of the library is missing" diff <(cd "$source/include" && ls) <(cd "$prefix/include/clock-ui" && ls -p | grep -v / | grep -vE 'device_(app|host).h')
+check "No header of the library is missing" diff <(cd "$source/include" && ls) <(cd "$prefix/include/clock-ui" && ls -p | grep -v / | grep -vE 'device_(app|host|remote).h')
 check "The themes are installed" test -s "$prefix/share/clock-ui/edje/AlarmEditViewController.edj"
 check "The texts are installed" test -s "$prefix/share/clock-ui/locale/en/LC_MESSAGES/clock.mo"
+
+# The simulator, in the installed files alone.
+sim=$prefix/bin/clock-sim
+check "The simulator is installed" is "$("$sim" --version)" "clock-sim $(sed -n 's/^project(clock-ui VERSION \([0-9.]*\).*/\1/p' "$source/CMakeLists.txt")"
+check "It loads no library of the build folder" is "$(ldd "$sim" | grep -c "$build")" 0
+check "It starts" starts "$sim"
+check "The city picker starts under its own name" starts "$(find "$prefix/libexec" -name '*.city-picker')"
+check "The tone picker is installed beside it" test -x "$(find "$prefix/libexec" -name '*.sound-tone-list')"
+desktop=$prefix/share/applications/clock-sim.desktop
+check "The desktop knows how to start it" is "$(sed -n 's/^Exec=//p' "$desktop")" clock-sim
+check "The desktop has its icon" test -s "$prefix/share/icons/hicolor/scalable/apps/$(sed -n 's/^Icon=//p' "$desktop").svg"
 
 mkdir "$work/cmake" && cp "$source/examples/AlarmEditorExample.cpp" "$work/cmake"
 cat >"$work/cmake/CMakeLists.txt" <<'TEXT'
