@@ -70,7 +70,7 @@ watch_display() {
     # The number of an earlier display must not be taken for this one's.
     rm -f "$number"
     # Without -noreset it starts anew when its last client goes, and refuses the next one meanwhile.
-    Xvfb -displayfd 3 -screen 0 360x360x24 -nolisten tcp -noreset 3>"$number" 2>"$1/xvfb.log" &
+    Xvfb -displayfd 3 -screen 0 "${WATCH_SCREEN-360x360}x24" -nolisten tcp -noreset 3>"$number" 2>"$1/xvfb.log" &
     watch_pids+=($!)
     watch_wait 20 test -s "$number" || return 1
     DISPLAY=:$(cat "$number")
