@@ -244,6 +244,8 @@ void drawAnew(const Evas_Object* list) {
         RimRow* rim = rimOf(row);
         if (!rim)
             return;
+        // Without being switched off first, the next map is clipped by the list before it shrinks.
+        evas_object_map_enable_set(row, EINA_FALSE);
         evas_object_map_set(row, nullptr);
         rim->area = {};
         place(row, *rim);

@@ -53,6 +53,17 @@ protected:
         elm_object_item_untrack(item);
         scrollTo(scrolled() + y - top);
     }
+    /** Places below the title where the face looks otherwise than before. */
+    std::string differences(const std::vector<unsigned>& before) {
+        const auto now = stage().pixels(0, 88, Stage::SIZE, 272);
+        std::string places;
+        for (std::size_t i = 0; i < now.size() && places.size() < 200; ++i) {
+            if (now[i] != before[i])
+                places += std::to_string(i % Stage::SIZE) + "," +
+                          std::to_string(88 + i / Stage::SIZE) + " ";
+        }
+        return places;
+    }
     Evas_Object* visible(const char* type) {
         const auto all = stage().widgets(type);
         return all.empty() ? nullptr : all.front();
@@ -156,6 +167,23 @@ TEST_F(RimTest, WhatChangesInASmallRowIsSeen) {
     evas_damage_rectangle_add(stage().canvas(), 0, 0, Stage::SIZE, Stage::SIZE);
     stage().settle();
     EXPECT_EQ(stage().pixels(60, 262, 240, 90), after) << "it is drawn late";
+}
+
+/** Rows at the list's upper edge were cut twice: at their full size, and once more as drawn. */
+TEST_F(RimTest, HowAListCameToAPlaceIsNotSeenThere) {
+    for (const int from : {0, 60, 130, 220, 400}) {
+        scrollTo(from);
+        stage().drag(60, 285, 0, -195);
+        stage().settle();
+        const int there = scrolled();
+        const auto dragged = stage().pixels(0, 88, Stage::SIZE, 272);
+        scrollTo(from);
+        scrollTo(there);
+        EXPECT_EQ(differences(dragged), "") << from;
+        elm_genlist_realized_items_update(genlist());
+        stage().settle();
+        EXPECT_EQ(differences(dragged), "") << from;
+    }
 }
 
 TEST_F(RimTest, RowsVanishSoftlyBelowTheTitle) {
