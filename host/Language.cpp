@@ -14,6 +14,7 @@
 #include "base/MessageLocale.h"
 #include "device/vconf.h"
 #include "widgets/Faces.h"
+#include "widgets/FontLanguage.h"
 
 #define LOG_TAG "device-host"
 #include "base/Log.h"
@@ -126,6 +127,7 @@ bool runsToTheLeft() {
 
 void tellToolkit() {
     turnFaces(runsToTheLeft());
+    setFontLanguage(base::messageLocale());
     elm_language_set(setlocale(LC_MESSAGES, nullptr));
     // The toolkit has taken that for every kind of locale.
     applyLocale();
@@ -163,6 +165,7 @@ void bindTexts(const std::string& catalogues) {
 
 void followLanguage() {
     elm_config_mirrored_set(runsToTheLeft());
+    setFontLanguage(base::messageLocale());
     if (vconf_notify_key_changed(languageKey, languageChangedCb, nullptr) != VCONF_OK)
         LOG_WARNING("A change of the language will not be seen");
 }

@@ -13,6 +13,7 @@
 #include "base/Text.h"
 #include "remote/FaceAgent.h"
 #include "widgets/DateTime.h"
+#include "widgets/FontLanguage.h"
 
 #define LOG_TAG "device-host"
 #include "base/Log.h"
@@ -35,6 +36,7 @@ bool isTheme(const std::string& path) {
 void addFonts() {
     static std::string added;
     const std::string folder = host::folders().resources + "/fonts";
+    host::chooseFonts(folder);
     if (added != folder)
         evas_font_path_global_append(folder.c_str());
     added = folder;
