@@ -24,6 +24,7 @@
 
 #include <clock/ClockStringUtil.h>
 #include <clock/ClockText.h>
+#include <clock/ClockWorldClockDbModel.h>
 
 #include "screens/CityPickerFixture.h"
 #include "screens/EditorFixture.h"
@@ -52,13 +53,6 @@ std::vector<std::string> languages() {
 
 std::string nameOf(const testing::TestParamInfo<std::string>& language) {
     return language.param;
-}
-
-std::vector<FoundText> without(std::vector<FoundText> texts, const char* widgetType) {
-    std::erase_if(texts, [&](const FoundText& found) {
-        return std::string_view(elm_object_widget_type_get(found.widget)) == widgetType;
-    });
-    return texts;
 }
 
 /** The editor and what opens over it. */
@@ -274,16 +268,30 @@ protected:
         worldOf({"IDS_CITY_DE_BERLIN_BERLIN", "IDS_CITY_JP_TOKYO", "IDS_CITY_IN_NEW_DELHI"});
         openPicker();
     }
-    // The names of cities may end in dots, but are as high as their letters.
-    std::vector<std::string> faults() {
-        auto faults = faultsOf(without(stage().texts(), "Elm_Genlist"));
-        for (const FoundText& found : stage().texts())
-            if (isTooLow(found))
-                faults.push_back(found.text + " is too low");
-        return faults;
+    std::vector<std::string> faults() { return faultsOf(stage().texts()); }
+
+    /** The cities whose rows say most. */
+    static std::vector<std::string> longestCities(std::size_t count) {
+        std::vector<ClockWorldClockDbData> all;
+        ClockWorldClockDbModel().getWorldClockAllCityList(all);
+        const auto length = [](const ClockWorldClockDbData& city) {
+            const std::string name = clockText(city.city.c_str());
+            return icu::UnicodeString::fromUTF8(name + clockText(city.country.c_str()))
+                .countChar32();
+        };
+        std::ranges::sort(all, std::ranges::greater(), length);
+        std::vector<std::string> ids;
+        for (std::size_t place = 0; place < std::min(count, all.size()); ++place)
+            ids.push_back(all[place].city);
+        return ids;
+    }
+    /** A row of which nothing is scrolled out. */
+    std::vector<std::string> faultsAt(Elm_Object_Item* row) {
+        stage().showRow(row);
+        stage().settle();
+        return faults();
     }
 
-private:
     std::unique_ptr<LiveLanguage> _language;
 };
 
@@ -306,6 +314,17 @@ TEST_P(CitiesLanguageTest, TheWordsThatNothingWasFoundAreTranslatedAndFit) {
     stage().screenshot("language-" + GetParam() + "-nothing");
     EXPECT_TRUE(stage().shows(clockText("IDS_CLOCK_NPBODY_NO_SEARCH_RESULTS")));
     EXPECT_THAT(faults(), IsEmpty());
+}
+
+TEST_P(CitiesLanguageTest, TheLongestNamesAreWholeOnTwoLines) {
+    _language = std::make_unique<LiveLanguage>();
+    _language->choose(GetParam());
+    worldOf(longestCities(12));
+    openPicker();
+    for (Elm_Object_Item* row : items())
+        EXPECT_THAT(faultsAt(row), IsEmpty()) << markupOf(row, "elm.text.main.left.top");
+    stage().showRow(items().at(5));
+    stage().screenshot("language-" + GetParam() + "-long-cities");
 }
 
 INSTANTIATE_TEST_SUITE_P(Language, CitiesLanguageTest, testing::ValuesIn(languages()), nameOf);

@@ -2,8 +2,11 @@
 
 #include <algorithm>
 #include <string_view>
+#include <utility>
 
 #include <Evas.h>
+
+#include "support/TextInk.h"
 
 namespace {
 
@@ -66,6 +69,10 @@ std::vector<std::string> faultsOf(const std::vector<FoundText>& texts) {
             faults.push_back(found.text + " is cut");
         else if (isTooLow(found))
             faults.push_back(found.text + " is too low");
+        else if (endsInDots(found))
+            faults.push_back(found.text + " ends in dots");
     }
+    for (std::string& fault : inkFaultsOf(texts))
+        faults.push_back(std::move(fault));
     return faults;
 }

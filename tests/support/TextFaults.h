@@ -13,5 +13,8 @@
 bool isCut(const FoundText& found);
 /** True when lines of a text block are higher than its place. */
 bool isTooLow(const FoundText& found);
-/** Texts without a translation, and texts that do not fit. */
+/**
+ * @brief Texts without a translation, texts that do not fit or end in dots, and texts whose pixels
+ * are lost or lie over those of others.
+ */
 std::vector<std::string> faultsOf(const std::vector<FoundText>& texts);
