@@ -81,15 +81,34 @@ void WorldClockViewController::askToRemove(const ClockWorldClockDbData& city) {
     if (!isOnTop())
         return;
     auto* popup = new app_assist::WPopupController();
-    popup->setOnAddProperties([name = std::string(clockText(city.city.c_str()))](Evas_Object* o) {
+    popup->setOnAddProperties([](Evas_Object* o) {
         elm_popup_align_set(o, ELM_NOTIFY_ALIGN_FILL, 1.0);
-        elm_object_part_text_set(o, "title,text", markupOf(name).c_str());
         elm_object_domain_translatable_part_text_set(o, nullptr, nullptr,
                                                      "IDS_WCL_POP_REMOVE_CITY_FROM_LIST");
     });
-    popup->addButton(clockText("IDS_COM_SK_CANCEL"), {});
-    popup->addButton(clockText("IDS_COM_SK_REMOVE"), [this, city](bool*) { remove(city); });
+    const auto labelled = [](const char* id) {
+        return [id](Evas_Object* button) {
+            elm_object_domain_translatable_text_set(button, nullptr, id);
+        };
+    };
+    popup->addButton("", {}, labelled("IDS_COM_SK_CANCEL"));
+    popup->addButton(
+        "", [this, city](bool*) { remove(city); }, labelled("IDS_COM_SK_REMOVE"));
     attachPopup(popup);
+    _question = popup->getWeakPtr();
+    _questionedCity = city.city;
+    nameCity();
+}
+
+void WorldClockViewController::nameCity() {
+    elm_object_part_text_set(_question->getEvasObj(), "title,text",
+                             markupOf(clockText(_questionedCity.c_str())).c_str());
+}
+
+void WorldClockViewController::onEvent(EventType type) {
+    ListPage::onEvent(type);
+    if (type == LANGUAGE_CHANGED && _question)
+        nameCity();
 }
 
 void WorldClockViewController::remove(const ClockWorldClockDbData& city) {

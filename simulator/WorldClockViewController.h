@@ -11,6 +11,8 @@
 #include <Ecore.h>
 
 #include "ListPage.h"
+#include "app_assist/WViewController.h"
+#include "app_assist/WWeakPtr.h"
 #include "clock/ClockWorldClockDbData.h"
 
 namespace simulator {
@@ -30,6 +32,7 @@ public:
 protected:
     void onCreated() override;
     void onDestroy() override;
+    void onEvent(EventType type) override;
     Elm_Object_Item* appendRows() override;
     void onAddTapped() override { addCity(); }
     void onOtherTapped() override;
@@ -43,6 +46,8 @@ private:
     /** Asks whether a city is to leave the list. */
     void askToRemove(const ClockWorldClockDbData& city);
     void remove(const ClockWorldClockDbData& city);
+    /** Writes which city the question is about. */
+    void nameCity();
 
     /** The city below another one, or above it when it is the last. */
     int neighbourOf(const ClockWorldClockDbData& city) const;
@@ -51,6 +56,8 @@ private:
     std::vector<ClockWorldClockDbData> _cities;
     int _shownKey = NONE; ///< The city that the next refresh brings into view.
     std::unique_ptr<Ecore_Timer, TimerDeleter> _minuteTimer;
+    app_assist::WWeakPtr<app_assist::WViewController> _question;
+    std::string _questionedCity; ///< Message identifier.
 };
 
 } // namespace simulator
