@@ -24,13 +24,18 @@ void expand(Evas_Object* object) {
     evas_object_size_hint_align_set(object, EVAS_HINT_FILL, EVAS_HINT_FILL);
 }
 
+void writeEmptyText(void*, Evas_Object* text, void*) {
+    const std::string centred =
+        std::string("<align=center>") + dgettext(nullptr, NO_TONES) + "</align>";
+    elm_object_text_set(text, centred.c_str());
+}
+
 /** In place of the list. */
 Evas_Object* createEmptyText(Evas_Object* parent) {
     Evas_Object* text = elm_label_add(parent);
     elm_label_line_wrap_set(text, ELM_WRAP_MIXED);
-    const std::string centred =
-        std::string("<align=center>") + dgettext(nullptr, NO_TONES) + "</align>";
-    elm_object_text_set(text, centred.c_str());
+    writeEmptyText(nullptr, text, nullptr);
+    evas_object_smart_callback_add(text, "language,changed", writeEmptyText, nullptr);
     evas_object_show(text);
     return text;
 }
