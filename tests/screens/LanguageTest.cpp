@@ -4,9 +4,11 @@
 #include <array>
 #include <cstdint>
 #include <cstdio>
+#include <cstdlib>
 #include <filesystem>
 #include <fstream>
 #include <iterator>
+#include <map>
 #include <memory>
 #include <numeric>
 #include <set>
@@ -18,6 +20,7 @@
 #include <Elementary.h>
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
+#include <libintl.h>
 #include <unicode/plurrule.h>
 #include <unicode/unistr.h>
 #include <unicode/ures.h>
@@ -252,6 +255,67 @@ TEST_P(PluralTest, TheToastCountsAsTheLanguageDoes) {
 }
 
 INSTANTIATE_TEST_SUITE_P(Language, PluralTest, testing::ValuesIn(languages()), nameOf);
+
+/** Counts as the rule of a catalogue's header does: the number of the form. */
+class CountingCatalogue {
+public:
+    explicit CountingCatalogue(const std::string& language) {
+        _folder = fs::temp_directory_path() / "plural-XXXXXX";
+        if (!mkdtemp(_folder.data()))
+            ADD_FAILURE() << "no temporary folder";
+        const std::string messages = _folder + "/" + language + "/LC_MESSAGES";
+        fs::create_directories(messages);
+        const std::string source = _folder + "/plural.po";
+        std::ofstream(source) << withForms(CLOCK_SOURCE_DIR "/po/" + language + ".po");
+        const std::string compile = "msgfmt -o " + messages + "/plural.mo " + source;
+        EXPECT_EQ(std::system(compile.c_str()), 0) << language;
+        setenv("LANGUAGE", language.c_str(), 1);
+        bindtextdomain("plural", _folder.c_str());
+        textdomain("clock");
+    }
+    ~CountingCatalogue() {
+        setenv("LANGUAGE", "en", 1);
+        textdomain("clock");
+        std::error_code ignored;
+        fs::remove_all(_folder, ignored);
+    }
+    CountingCatalogue(const CountingCatalogue&) = delete;
+    CountingCatalogue& operator=(const CountingCatalogue&) = delete;
+
+    static std::string form(int count) {
+        return dngettext("plural", "one", "many", static_cast<unsigned long>(count));
+    }
+
+private:
+    /** The header alone, and one text that says which form it has. */
+    static std::string withForms(const std::string& catalogue) {
+        std::ifstream file(catalogue);
+        std::string header;
+        for (std::string line; std::getline(file, line) && !line.empty();)
+            header += line + "\n";
+        int forms = 0;
+        std::sscanf(header.c_str() + header.find("nplurals="), "nplurals=%d", &forms);
+        header += "\nmsgid \"one\"\nmsgid_plural \"many\"\n";
+        for (int form = 0; form < forms; ++form)
+            header += "msgstr[" + std::to_string(form) + "] \"" + std::to_string(form) + "\"\n";
+        return header;
+    }
+
+    std::string _folder;
+};
+
+TEST_P(PluralTest, TheRuleOfTheCatalogueIsTheLanguages) {
+    const CountingCatalogue catalogue(GetParam());
+    std::map<std::string, std::string> names;
+    std::set<std::string> forms;
+    for (int count = 0; count <= 1000; ++count) {
+        const std::string form = CountingCatalogue::form(count);
+        const std::string name = pluralForm(GetParam(), count);
+        EXPECT_EQ(names.emplace(form, name).first->second, name) << count;
+        forms.insert(name);
+    }
+    EXPECT_EQ(names.size(), forms.size());
+}
 
 /** The city picker. */
 class CitiesLanguageTest : public CityPickerFixture,

@@ -189,15 +189,20 @@ std::vector<std::string> languagesOf(const fs::path& root) {
     return languages;
 }
 
+std::string headerOf(const Reader& catalogue) {
+    const bool hasHeader = !catalogue.entries.empty() && catalogue.entries.front().id.empty();
+    return hasHeader ? catalogue.entries.front().text : "";
+}
+
 /** What is wrong with the catalogues of a tree. */
 Faults catalogueFaults(const fs::path& root) {
     const Reader english(contentsOf(root / "po/en.po"));
     Faults all = english.faults;
+    checkHeader("en", headerOf(english), all);
     for (const auto& language : languagesOf(root)) {
         const Reader reader(contentsOf(root / "po" / (language + ".po")));
         Faults faults = reader.faults;
-        const bool hasHeader = !reader.entries.empty() && reader.entries.front().id.empty();
-        checkHeader(language, hasHeader ? reader.entries.front().text : "", faults);
+        checkHeader(language, headerOf(reader), faults);
         checkEntries(english.entries, reader.entries, faults);
         for (const auto& fault : faults)
             all.push_back(std::string(language).append(": ").append(fault));
