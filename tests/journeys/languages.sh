@@ -86,4 +86,47 @@ wait "لا توجد نتائج"
 set language de
 wait "Keine Ergebnisse"
 SCRIPT
+
+check "Lists follow the hours, the region and the language" scripted lists --language en <<'SCRIPT'
+set clock "2026-11-20 12:00"
+set region en_US
+tap Create
+time 18:25
+scroll-to Alarm
+tap Alarm
+type "Tea"
+tap Done
+wait "Alarm set for"
+expect "18:25"
+set time-form 12
+wait "6:25 PM"
+expect-not "18:25"
+set language ko
+wait "오후 6:25"
+set region de_DE
+set time-form 24
+wait "18:25"
+set language ar
+wait "المنبّهات"
+expect "18:25"
+expect "Tea"
+screenshot alarms-ar.png
+set language en
+wait "World clock"
+tap "World clock"
+tap "Add city"
+tap Search
+type kathm
+tap "Kathmandu, Nepal"
+wait "16:4"
+set time-form 12
+wait "4:4"
+expect-not "16:4"
+set language ja
+wait "午後4:4"
+expect "カトマンズ"
+screenshot cities-ja.png
+set language de
+wait Kathmandu
+SCRIPT
 check_end

@@ -13,6 +13,9 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <clock/ClockText.h>
+#include <clock/ClockWorldClockDbModel.h>
+
 #include "screens/CityPickerFixture.h"
 #include "screens/DatePopupFixture.h"
 #include "screens/EditorFixture.h"
@@ -271,5 +274,36 @@ TEST_P(CitySwitchTest, AHalfTypedSearchStays) {
 }
 
 INSTANTIATE_TEST_SUITE_P(Languages, CitySwitchTest, testing::ValuesIn(CHANGES), nameOf);
+
+class CityOrderSwitchTest : public Switching<CityPickerFixture> {};
+
+TEST_P(CityOrderSwitchTest, TheOrderStaysThatOfTheLanguageInWhichThePickerOpened) {
+    std::vector<ClockWorldClockDbData> all;
+    ClockWorldClockDbModel().getWorldClockAllCityList(all);
+    std::vector<std::string> ids;
+    for (std::size_t place = 0; place < all.size() && ids.size() < 150; ++place)
+        if (all[place].timezone == "GMT+01:00")
+            ids.push_back(all[place].city);
+    worldOf(ids);
+    _language->choose(GetParam().to);
+    openPicker();
+    const auto other = cities();
+    takeStageDown();
+    _language->choose(GetParam().from);
+    openPicker();
+    const auto order = cities();
+    ASSERT_NE(order, other);
+    const auto labels = hours();
+    _language->choose(GetParam().to);
+    EXPECT_TRUE(stage().settle());
+    EXPECT_EQ(cities(), order);
+    EXPECT_EQ(hours(), labels);
+    // Each key lists the cities anew.
+    search(clockText(order.front().c_str()));
+    eraseSearch();
+    EXPECT_EQ(cities(), order);
+}
+
+INSTANTIATE_TEST_SUITE_P(Languages, CityOrderSwitchTest, testing::ValuesIn(CHANGES), nameOf);
 
 } // namespace
