@@ -3,99 +3,21 @@
 #include <cmath>
 #include <memory>
 #include <string>
+#include <utility>
 #include <vector>
 
-#include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
 #include <clock/ClockText.h>
 
+#include "TonePage.h"
 #include "screens/CityPickerFixture.h"
 #include "screens/EditorFixture.h"
-#include "screens/TestCatalogue.h"
-#include "support/FaceInk.h"
-
-using testing::IsEmpty;
+#include "support/FaceFixture.h"
 
 namespace {
 
-constexpr double RADIUS = 180;
-/** What is fainter than this is on its way out. */
-constexpr double FAINT = 0.08;
-constexpr const char* HOURS_KEY = "db/menu_widget/regionformat_time1224";
-
-std::string describe(const Ink& ink) {
-    const auto number = [](double value) {
-        return std::to_string(std::lround(value));
-    };
-    return ink.what + " at " + number(ink.area.x) + ", " + number(ink.area.y) + ", " +
-           number(ink.area.width) + " x " + number(ink.area.height) + ", seen " +
-           std::to_string(ink.opacity) + ", reaches " + number(ink.area.reach());
-}
-
-/** What the circle cuts, of all that can be seen. */
-std::vector<std::string> cutByCircle(const Evas* canvas) {
-    std::vector<std::string> cut;
-    for (const Ink& ink : inkOf(canvas)) {
-        if (ink.opacity >= FAINT && ink.area.reach() > RADIUS)
-            cut.push_back(describe(ink));
-    }
-    return cut;
-}
-
-std::string nameOf(const testing::TestParamInfo<const char*>& language) {
-    return language.param;
-}
-
-const auto LANGUAGES = testing::Values("en", "de", "ar", "hi", "ja");
-
-/** A language with its direction. */
-class Speaking {
-public:
-    explicit Speaking(const std::string& code) : _catalogue(code) {
-        elm_config_mirrored_set(code == "ar" ? EINA_TRUE : EINA_FALSE);
-    }
-    ~Speaking() { elm_config_mirrored_set(EINA_FALSE); }
-    Speaking(const Speaking&) = delete;
-    Speaking& operator=(const Speaking&) = delete;
-
-private:
-    CatalogueLanguage _catalogue;
-};
-
-class EditorFaceTest : public EditorFixture, public testing::WithParamInterface<const char*> {
-protected:
-    void SetUp() override {
-        EditorFixture::SetUp();
-        _language = std::make_unique<Speaking>(GetParam());
-        device().setSetting(HOURS_KEY, 1);
-    }
-    void TearDown() override {
-        EditorFixture::TearDown();
-        _language.reset();
-    }
-    /** Looks at the face as it is. */
-    void look(const std::string& name) {
-        EXPECT_THAT(cutByCircle(stage().canvas()), IsEmpty()) << name;
-        stage().screenshot(std::string("face-") + GetParam() + "-" + name);
-    }
-    /** Looks at a list at its upper end, wherever it may come to rest, and at its lower end. */
-    void lookAtList(Evas_Object* list, const std::string& name) {
-        int height = 0;
-        int shown = 0;
-        elm_scroller_child_size_get(list, nullptr, &height);
-        elm_scroller_region_get(list, nullptr, nullptr, nullptr, &shown);
-        const int steps = 8;
-        for (int step = 0; step <= steps; ++step) {
-            elm_scroller_region_show(list, 0, (height - shown) * step / steps, 1, shown);
-            stage().settle();
-            look(name + "-" + std::to_string(step));
-        }
-    }
-
-private:
-    std::unique_ptr<Speaking> _language;
-};
+class EditorFaceTest : public FaceFixture<EditorFixture> {};
 
 TEST_P(EditorFaceTest, TheEditor) {
     createAlarm();
@@ -145,27 +67,14 @@ TEST_P(EditorFaceTest, TheDiscardPopup) {
     look("discard");
 }
 
-INSTANTIATE_TEST_SUITE_P(Languages, EditorFaceTest, LANGUAGES, nameOf);
+INSTANTIATE_TEST_SUITE_P(Languages, EditorFaceTest, FACE_LANGUAGES, languageOf);
 
-class CitiesFaceTest : public CityPickerFixture, public testing::WithParamInterface<const char*> {
+class CitiesFaceTest : public FaceFixture<CityPickerFixture> {
 protected:
     void SetUp() override {
-        CityPickerFixture::SetUp();
-        _language = std::make_unique<Speaking>(GetParam());
+        FaceFixture::SetUp();
         openPicker();
-        fill();
     }
-    void TearDown() override {
-        CityPickerFixture::TearDown();
-        _language.reset();
-    }
-    void look(const std::string& name) {
-        EXPECT_THAT(cutByCircle(stage().canvas()), IsEmpty()) << name;
-        stage().screenshot(std::string("face-") + GetParam() + "-" + name);
-    }
-
-private:
-    std::unique_ptr<Speaking> _language;
 };
 
 TEST_P(CitiesFaceTest, AllCities) {
@@ -184,7 +93,8 @@ TEST_P(CitiesFaceTest, AllCities) {
 }
 
 TEST_P(CitiesFaceTest, AFingerOnTheIndex) {
-    stage().press(338, 200);
+    const bool mirrored = elm_config_mirrored_get() != EINA_FALSE;
+    stage().press(mirrored ? Stage::SIZE - 338 : 338, 200);
     stage().settle();
     look("cities-index");
     stage().release();
@@ -199,6 +109,46 @@ TEST_P(CitiesFaceTest, NothingIsFound) {
     look("cities-nothing");
 }
 
-INSTANTIATE_TEST_SUITE_P(Languages, CitiesFaceTest, LANGUAGES, nameOf);
+INSTANTIATE_TEST_SUITE_P(Languages, CitiesFaceTest, FACE_LANGUAGES, languageOf);
+
+/** The page of the device's tone picker, an application of its own. */
+class TonesFaceTest : public FaceFixture<ScreenTest> {
+protected:
+    void TearDown() override {
+        takeStageDown();
+        page.reset();
+        FaceFixture::TearDown();
+    }
+    void open(std::vector<tone_picker::Tone> tones, int marked) {
+        page = std::make_unique<tone_picker::TonePage>(
+            std::move(tones), marked,
+            tone_picker::TonePage::Actions{
+                .marked = [](int) {}, .done = [](int) {}, .cancelled = [] {}});
+        page->show(stage().window());
+        stage().settle();
+    }
+
+    std::unique_ptr<tone_picker::TonePage> page;
+};
+
+TEST_P(TonesFaceTest, SeveralTones) {
+    open({{"a.ogg", "Bells"},
+          {"b.ogg", "WWWWWWWWWWWWWWWWWWWWWWWWWW"},
+          {"c.ogg", "Chimes at noon"},
+          {"d.ogg", "\u0623\u062c\u0631\u0627\u0633"},
+          {"e.ogg", "Digital"},
+          {"f.ogg", "Xylophone"}},
+         1);
+    const auto lists = stage().widgets("Elm_Genlist");
+    ASSERT_EQ(lists.size(), 1U);
+    lookAtList(lists.front(), "tones");
+}
+
+TEST_P(TonesFaceTest, NoTones) {
+    open({}, -1);
+    look("no-tones");
+}
+
+INSTANTIATE_TEST_SUITE_P(Languages, TonesFaceTest, FACE_LANGUAGES, languageOf);
 
 } // namespace

@@ -3,11 +3,17 @@
 #include <algorithm>
 #include <cmath>
 #include <cstdlib>
+#include <sstream>
 #include <string_view>
+
+#include <Edje.h>
 
 namespace {
 
 constexpr double MIDDLE = 180;
+constexpr double RADIUS = 180;
+/** What is fainter than this is on its way out. */
+constexpr double FAINT = 0.08;
 
 InkArea areaOf(const Evas_Object* object) {
     int x = 0;
@@ -130,13 +136,40 @@ void addLines(std::vector<Ink>& found, Evas_Object* block) {
 }
 
 /** Clips others, softens them in the colour of the ground, or is what is around the face. */
-bool isHelper(const Evas_Object* image) {
+bool isHelper(const Evas_Object* object) {
     int red = 0;
     int green = 0;
     int blue = 0;
-    evas_object_color_get(image, &red, &green, &blue, nullptr);
-    return evas_object_clipees_has(image) || red + green + blue == 0 ||
-           evas_object_layer_get(image) == EVAS_LAYER_MAX;
+    evas_object_color_get(object, &red, &green, &blue, nullptr);
+    return evas_object_clipees_has(object) || red + green + blue == 0 ||
+           evas_object_layer_get(object) == EVAS_LAYER_MAX;
+}
+
+/** A theme names in "bleed" what the rim is meant to cut: the grounds of what reaches the rim. */
+bool isMeantToBeCut(Evas_Object* object) {
+    Evas_Object* const group = evas_object_smart_parent_get(object);
+    if (group == nullptr || std::string_view(evas_object_type_get(group)) != "edje")
+        return false;
+    const char* const parts = edje_object_data_get(group, "bleed");
+    std::istringstream names(parts == nullptr ? "" : parts);
+    for (std::string name; names >> name;) {
+        if (edje_object_part_object_get(group, name.c_str()) == object)
+            return true;
+    }
+    return false;
+}
+
+std::string groupOf(const Evas_Object* object) {
+    const Evas_Object* const parent = evas_object_smart_parent_get(object);
+    const char* group = nullptr;
+    if (parent != nullptr && std::string_view(evas_object_type_get(parent)) == "edje")
+        edje_object_file_get(parent, nullptr, &group);
+    return group == nullptr ? "no group" : group;
+}
+
+void addRectangle(std::vector<Ink>& found, Evas_Object* rectangle) {
+    if (!isHelper(rectangle) && !isMeantToBeCut(rectangle))
+        add(found, rectangle, "rectangle of " + groupOf(rectangle), areaOf(rectangle), false);
 }
 
 void addImage(std::vector<Ink>& found, Evas_Object* image) {
@@ -161,12 +194,23 @@ void visit(std::vector<Ink>& found, Evas_Object* object) {
         return addLines(found, object);
     if (type == "image")
         return addImage(found, object);
-    if (type == "rectangle" || type == "vg" || type == "line" || type == "polygon")
+    if (type == "rectangle")
+        return addRectangle(found, object);
+    if (type == "vg" || type == "line" || type == "polygon")
         return;
     Eina_List* members = evas_object_smart_members_get(object);
     for (const Eina_List* l = members; l != nullptr; l = eina_list_next(l))
         visit(found, static_cast<Evas_Object*>(eina_list_data_get(l)));
     eina_list_free(members);
+}
+
+std::string describe(const Ink& ink) {
+    const auto number = [](double value) {
+        return std::to_string(std::lround(value));
+    };
+    return ink.what + " at " + number(ink.area.x) + ", " + number(ink.area.y) + ", " +
+           number(ink.area.width) + " x " + number(ink.area.height) + ", seen " +
+           std::to_string(ink.opacity) + ", reaches " + number(ink.area.reach());
 }
 
 } // namespace
@@ -190,4 +234,13 @@ std::vector<Ink> inkOf(const Evas* canvas) {
             visit(found, object);
     }
     return found;
+}
+
+std::vector<std::string> cutByCircle(const Evas* canvas) {
+    std::vector<std::string> cut;
+    for (const Ink& ink : inkOf(canvas)) {
+        if (ink.opacity >= FAINT && ink.area.reach() > RADIUS)
+            cut.push_back(describe(ink));
+    }
+    return cut;
 }

@@ -19,17 +19,24 @@ struct InkArea {
     double reach() const;
 };
 
-/** A line of text, or an image, as far as it can be seen. */
+/** A line of text, an image, or the rectangle of a ground or a line, as far as it can be seen. */
 struct Ink {
-    std::string what; ///< The text, or the file of the image.
+    std::string what; ///< The text, the file of the image, or the group of the rectangle.
     Evas_Object* object = nullptr;
     InkArea area;
     double opacity = 1; ///< 0..1
     bool isText = false;
 };
 
-/** Everything drawn on a canvas that is not covered altogether. */
+/**
+ * @brief Everything drawn on a canvas that is not covered altogether.
+ *
+ * Without what has the colour of the ground, and what the theme's data "bleed" names.
+ */
 std::vector<Ink> inkOf(const Evas* canvas);
+
+/** What the circle of the face cuts, of all that can be seen well; each with its place. */
+std::vector<std::string> cutByCircle(const Evas* canvas);
 
 /** Where a rectangle of an object is drawn: maps of what it is part of move and shrink it. */
 InkArea drawnArea(const Evas_Object* object, InkArea area);
