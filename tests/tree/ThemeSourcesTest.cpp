@@ -26,8 +26,7 @@ constexpr int NAMED_FROM = 17;
 constexpr const char* VOCABULARY = "edje/vocabulary/";
 
 bool isThemeSource(const std::string& file) {
-    return file.ends_with(".edc") && !file.starts_with(VOCABULARY) && !file.starts_with("tests/") &&
-           file != "simulator/control.edc";
+    return file.ends_with(".edc") && !file.starts_with(VOCABULARY) && !file.starts_with("tests/");
 }
 
 std::vector<std::string> linesOf(const fs::path& file) {
@@ -54,9 +53,16 @@ bool hasLongNumber(const std::string& value) {
     return false;
 }
 
-std::set<std::string> typeSizes(const fs::path& root) {
-    static const std::regex size(R"(#define TYPE_\w+ (\d+))");
-    return matches(contentsOf(root / VOCABULARY / "sizes.edc"), size, 1);
+std::set<std::string> typeSizesIn(const fs::path& file) {
+    static const std::regex size(R"(#define (?:\w+_)?TYPE_\w+ (\d+))");
+    return matches(contentsOf(file), size, 1);
+}
+
+/** Those of every face, and those that a theme names for itself at its top. */
+std::set<std::string> typeSizes(const fs::path& root, const std::string& file) {
+    std::set<std::string> sizes = typeSizesIn(root / VOCABULARY / "sizes.edc");
+    sizes.merge(typeSizesIn(root / file));
+    return sizes;
 }
 
 /** What is wrong with a line; empty when nothing is. */
@@ -65,6 +71,7 @@ std::string faultOf(const std::string& line, const std::set<std::string>& sizes)
     static const std::regex font(R"(\bfont: *")");
     static const std::regex fontSize(R"(font_size=(\d+))");
     static const std::regex colour(R"((?:^|[\s.])color: *(?!255 255 255 |0 0 0 )\d)");
+    static const std::regex textColour(R"(color=#)");
     static const std::regex seconds(R"(transition: *\w+ +[\d.])");
     if (line.starts_with("#define ") && line.find('(') == std::string::npos)
         return "";
@@ -77,17 +84,17 @@ std::string faultOf(const std::string& line, const std::set<std::string>& sizes)
     for (const auto& size : matches(line, fontSize, 1))
         if (!sizes.contains(size))
             return "font size " + size;
-    if (std::regex_search(line, colour))
+    if (std::regex_search(line, colour) || std::regex_search(line, textColour))
         return "colour";
     return std::regex_search(line, seconds) ? "seconds" : "";
 }
 
 std::vector<std::string> literals(const fs::path& root) {
     std::vector<std::string> found;
-    const auto sizes = typeSizes(root);
     for (const auto& file : filesOf(root)) {
         if (!isThemeSource(file))
             continue;
+        const auto sizes = typeSizes(root, file);
         int number = 0;
         for (const auto& line : linesOf(root / file)) {
             ++number;
@@ -130,9 +137,28 @@ bool isInTheme(const std::set<std::string>& names, const std::string& name) {
 }
 
 bool isWidgetCode(const std::string& file) {
-    return isSource(file) && !file.starts_with("simulator/control/") &&
-           (file.starts_with("src/") || file.starts_with("host/") ||
-            file.starts_with("simulator/") || file.starts_with("platform/app_assist/"));
+    return isSource(file) && (file.starts_with("src/") || file.starts_with("host/") ||
+                              file.starts_with("simulator/") ||
+                              file.starts_with("platform/app_assist/"));
+}
+
+std::set<std::string> widgetCode(const fs::path& root) {
+    std::set<std::string> texts;
+    for (const auto& file : filesOf(root))
+        if (isWidgetCode(file))
+            texts.insert(contentsOf(root / file));
+    return texts;
+}
+
+/** The groups of layouts by their class, group and style. */
+std::set<std::string> layoutGroups(const std::string& text) {
+    static const std::regex form(
+        R"re(layout_theme_set\([^,;]+,\s*"([^"]+)",\s*"([^"]+)",\s*"([^"]+)"\))re");
+    std::set<std::string> groups;
+    for (std::sregex_iterator match(text.begin(), text.end(), form), end; match != end; ++match)
+        groups.insert("elm/" + (*match)[1].str() + "/" + (*match)[2].str() + "/" +
+                      (*match)[3].str());
+    return groups;
 }
 
 /** The parts, styles, groups and signals that code asks the themes for. */
@@ -146,20 +172,59 @@ std::set<std::string> codeNames(const fs::path& root) {
         std::regex(R"re(layout_file_set\([^;]+,\s*"([^"]+)"\))re"),
         std::regex(R"re(signal_(?:emit|callback_add)\([^,;]+,\s*"([^"]+)")re"),
         std::regex(R"re(item_style = "([^"]+)")re"),
+        std::regex(R"re((?:STYLE|PART|GROUP|SIGNAL|DATA)_\w+ = "([^"]+)")re"),
+        // The looks of the control panel's widgets.
+        std::regex(R"re(inline constexpr const char\* (?:PLAIN|KEY|SET) = "([^"]+)")re"),
     };
     // Parts that the toolkit makes out of others, and its own events.
-    static const std::set<std::string> toolkit{"title,text", "elm,action,focus",
+    static const std::set<std::string> toolkit{"title,text", "guide", "elm,action,focus",
                                                "elm,action,unfocus", "default"};
     std::set<std::string> names;
-    for (const auto& file : filesOf(root)) {
-        if (!isWidgetCode(file))
-            continue;
-        const std::string text = contentsOf(root / file);
+    for (const auto& text : widgetCode(root)) {
         for (const auto& form : forms)
             names.merge(matches(text, form, 1));
+        names.merge(layoutGroups(text));
     }
     std::erase_if(names, [](const std::string& name) { return toolkit.contains(name); });
     return names;
+}
+
+/**
+ * What a theme offers to code and not to the toolkit: texts and places for other things, layouts
+ * of the simulator, and signals whose source is the device or the simulator.
+ */
+std::set<std::string> offeredNames(const std::string& theme) {
+    static const std::vector<std::regex> forms{
+        std::regex(R"re(part \{ name: "([^"]+)"; type: (?:TEXT|TEXTBLOCK|SWALLOW);)re"),
+        std::regex(R"re(dragable[^}]*confine: "([^"]+)")re"),
+        std::regex(R"re(group \{ name: "elm/simulator/control/([^"]+)")re"),
+        std::regex(R"re(signal: "([^"]+)"; source: "(?:device|simulator)")re"),
+        std::regex(R"re(SIGNAL_EMIT "([^"]+)" "(?:device|simulator)")re"),
+    };
+    std::set<std::string> names;
+    for (const auto& form : forms)
+        names.merge(matches(theme, form, 1));
+    std::erase_if(names, [](const std::string& name) { return name.starts_with("elm"); });
+    return names;
+}
+
+/** What themes offer and no code uses. */
+std::vector<std::string> unused(const fs::path& root) {
+    static const std::regex quoted(R"re("([^"\n]+)")re");
+    // The toolkit writes the first, the others are for their own group alone.
+    static const std::set<std::string> own{"month_text", "title.full", "bar", "volume.track"};
+    std::set<std::string> used = own;
+    for (const auto& text : widgetCode(root))
+        used.merge(matches(text, quoted, 1));
+    std::vector<std::string> found;
+    for (const auto& file : filesOf(root)) {
+        if (!isThemeSource(file))
+            continue;
+        for (const auto& name : offeredNames(contentsOf(root / file)))
+            if (!used.contains(name) && !name.starts_with("cit_"))
+                found.push_back(std::string(file).append(": ").append(name));
+    }
+    return found;
 }
 
 std::set<std::string> documentedNames(const fs::path& root) {
@@ -215,6 +280,10 @@ TEST(ThemeSources, WhatCodeAsksForIsInATheme) {
     EXPECT_THAT(unknownToThemes(CLOCK_SOURCE_DIR), IsEmpty());
 }
 
+TEST(ThemeSources, WhatThemesOfferIsUsed) {
+    EXPECT_THAT(unused(CLOCK_SOURCE_DIR), IsEmpty());
+}
+
 TEST(ThemeSources, WhatCodeAsksForIsDocumented) {
     EXPECT_THAT(undocumented(CLOCK_SOURCE_DIR), IsEmpty());
 }
@@ -234,13 +303,41 @@ TEST(ThemeSources, LiteralsAreFound) {
                                           "base: \"font_size=22\";\n"
                                           "description { color: 12 0 0 255; }\n"
                                           "description { color: 0 0 0 0; }\n"
+                               "tag: \"a\" \"+ color=#ffd166\";\n"
                                           "program { transition: LINEAR 0.3; }\n");
     EXPECT_THAT(literals(tree.root()), ElementsAre("host/theme/groups/a.edc:1: length 0 48",
                                                    "host/theme/groups/a.edc:3: length 22",
                                                    "host/theme/groups/a.edc:4: font",
                                                    "host/theme/groups/a.edc:5: font size 21",
                                                    "host/theme/groups/a.edc:7: colour",
-                                                   "host/theme/groups/a.edc:9: seconds"));
+                                                   "host/theme/groups/a.edc:9: colour",
+                                                   "host/theme/groups/a.edc:10: seconds"));
+}
+
+TEST(ThemeSources, AThemeMayNameTypeSizesOfItsOwn) {
+    const PlantedTree tree;
+    tree.plant("edje/vocabulary/sizes.edc", "#define TYPE_BODY 22\n");
+    tree.plant("simulator/control.edc",
+               "#define CONTROL_TYPE_TEXT 12\nbase: \"font_size=12\";\n");
+    tree.plant("simulator/simulator.edc", "base: \"font_size=12\";\n");
+    EXPECT_THAT(literals(tree.root()), ElementsAre("simulator/simulator.edc:1: font size 12"));
+}
+
+TEST(ThemeSources, WhatNoCodeUsesIsFound) {
+    const PlantedTree tree;
+    tree.plant("simulator/control.edc",
+               "group { name: \"elm/simulator/control/lamp\";\n"
+               "part { name: \"lamp.text\"; type: TEXT; mouse_events: 0;\n"
+               "part { name: \"lamp.ring\"; type: IMAGE;\n"
+               "part { name: \"elm.text\"; type: TEXT;\n"
+               "program { signal: \"lamp,on\"; source: \"simulator\"; }\n"
+               "program { signal: \"elm,state,on\"; source: \"elm\"; }\n"
+               "action: SIGNAL_EMIT \"lamp,lit\" \"simulator\"; }\n");
+    tree.plant("simulator/control/Lamp.cpp",
+               "elm_layout_theme_set(lamp, \"simulator\", \"control\", \"lamp\");\n"
+               "elm_object_signal_emit(lamp, \"lamp,on\", \"simulator\");\n");
+    EXPECT_THAT(unused(tree.root()), ElementsAre("simulator/control.edc: lamp,lit",
+                                                 "simulator/control.edc: lamp.text"));
 }
 
 TEST(ThemeSources, NamesThatDoNotMatchAreFound) {
@@ -248,9 +345,11 @@ TEST(ThemeSources, NamesThatDoNotMatchAreFound) {
     tree.plant("host/theme/groups/a.edc", "part { name: \"elm.text\"; } part { name: \"new\"; }\n");
     tree.plant("src/Page.cpp", "elm_object_part_text_set(page, \"elm.text\", \"a\");\n"
                                "elm_object_part_content_set(page, \"lost\", icon);\n"
-                               "elm_layout_signal_emit(page, \"elm,state,lost\", \"elm\");\n");
+                               "elm_layout_signal_emit(page, \"elm,state,lost\", \"elm\");\n"
+                               "elm_layout_theme_set(page, \"layout\", \"gone\", \"b\");\n"
+                               "constexpr const char* PART_OLD = \"old\";\n");
     tree.plant("docs/THEME.md", "`elm.text` and `elm.gone` and `lost`\n");
-    EXPECT_THAT(unknownToThemes(tree.root()), ElementsAre("elm,state,lost", "lost"));
-    EXPECT_THAT(undocumented(tree.root()), ElementsAre("elm,state,lost"));
+    EXPECT_THAT(unknownToThemes(tree.root()), ElementsAre("elm,state,lost", "elm/layout/gone/b", "lost", "old"));
+    EXPECT_THAT(undocumented(tree.root()), ElementsAre("elm,state,lost", "elm/layout/gone/b", "old"));
     EXPECT_THAT(outdated(tree.root()), ElementsAre("elm.gone"));
 }
