@@ -122,8 +122,11 @@ protected:
     void open(std::vector<tone_picker::Tone> tones, int marked) {
         page = std::make_unique<tone_picker::TonePage>(
             std::move(tones), marked,
-            tone_picker::TonePage::Actions{
-                .marked = [](int) {}, .done = [](int) {}, .cancelled = [] {}});
+            tone_picker::TonePage::Actions{.marked = [](int) {},
+                                           .done = [](int) {},
+                                           .cancelled =
+                                               [] {
+                                               }});
         page->show(stage().window());
         stage().settle();
     }

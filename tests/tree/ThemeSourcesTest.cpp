@@ -137,9 +137,9 @@ bool isInTheme(const std::set<std::string>& names, const std::string& name) {
 }
 
 bool isWidgetCode(const std::string& file) {
-    return isSource(file) && (file.starts_with("src/") || file.starts_with("host/") ||
-                              file.starts_with("simulator/") ||
-                              file.starts_with("platform/app_assist/"));
+    return isSource(file) &&
+           (file.starts_with("src/") || file.starts_with("host/") ||
+            file.starts_with("simulator/") || file.starts_with("platform/app_assist/"));
 }
 
 std::set<std::string> widgetCode(const fs::path& root) {
@@ -303,41 +303,38 @@ TEST(ThemeSources, LiteralsAreFound) {
                                           "base: \"font_size=22\";\n"
                                           "description { color: 12 0 0 255; }\n"
                                           "description { color: 0 0 0 0; }\n"
-                               "tag: \"a\" \"+ color=#ffd166\";\n"
+                                          "tag: \"a\" \"+ color=#ffd166\";\n"
                                           "program { transition: LINEAR 0.3; }\n");
-    EXPECT_THAT(literals(tree.root()), ElementsAre("host/theme/groups/a.edc:1: length 0 48",
-                                                   "host/theme/groups/a.edc:3: length 22",
-                                                   "host/theme/groups/a.edc:4: font",
-                                                   "host/theme/groups/a.edc:5: font size 21",
-                                                   "host/theme/groups/a.edc:7: colour",
-                                                   "host/theme/groups/a.edc:9: colour",
-                                                   "host/theme/groups/a.edc:10: seconds"));
+    EXPECT_THAT(
+        literals(tree.root()),
+        ElementsAre("host/theme/groups/a.edc:1: length 0 48",
+                    "host/theme/groups/a.edc:3: length 22", "host/theme/groups/a.edc:4: font",
+                    "host/theme/groups/a.edc:5: font size 21", "host/theme/groups/a.edc:7: colour",
+                    "host/theme/groups/a.edc:9: colour", "host/theme/groups/a.edc:10: seconds"));
 }
 
 TEST(ThemeSources, AThemeMayNameTypeSizesOfItsOwn) {
     const PlantedTree tree;
     tree.plant("edje/vocabulary/sizes.edc", "#define TYPE_BODY 22\n");
-    tree.plant("simulator/control.edc",
-               "#define CONTROL_TYPE_TEXT 12\nbase: \"font_size=12\";\n");
+    tree.plant("simulator/control.edc", "#define CONTROL_TYPE_TEXT 12\nbase: \"font_size=12\";\n");
     tree.plant("simulator/simulator.edc", "base: \"font_size=12\";\n");
     EXPECT_THAT(literals(tree.root()), ElementsAre("simulator/simulator.edc:1: font size 12"));
 }
 
 TEST(ThemeSources, WhatNoCodeUsesIsFound) {
     const PlantedTree tree;
-    tree.plant("simulator/control.edc",
-               "group { name: \"elm/simulator/control/lamp\";\n"
-               "part { name: \"lamp.text\"; type: TEXT; mouse_events: 0;\n"
-               "part { name: \"lamp.ring\"; type: IMAGE;\n"
-               "part { name: \"elm.text\"; type: TEXT;\n"
-               "program { signal: \"lamp,on\"; source: \"simulator\"; }\n"
-               "program { signal: \"elm,state,on\"; source: \"elm\"; }\n"
-               "action: SIGNAL_EMIT \"lamp,lit\" \"simulator\"; }\n");
+    tree.plant("simulator/control.edc", "group { name: \"elm/simulator/control/lamp\";\n"
+                                        "part { name: \"lamp.text\"; type: TEXT; mouse_events: 0;\n"
+                                        "part { name: \"lamp.ring\"; type: IMAGE;\n"
+                                        "part { name: \"elm.text\"; type: TEXT;\n"
+                                        "program { signal: \"lamp,on\"; source: \"simulator\"; }\n"
+                                        "program { signal: \"elm,state,on\"; source: \"elm\"; }\n"
+                                        "action: SIGNAL_EMIT \"lamp,lit\" \"simulator\"; }\n");
     tree.plant("simulator/control/Lamp.cpp",
                "elm_layout_theme_set(lamp, \"simulator\", \"control\", \"lamp\");\n"
                "elm_object_signal_emit(lamp, \"lamp,on\", \"simulator\");\n");
-    EXPECT_THAT(unused(tree.root()), ElementsAre("simulator/control.edc: lamp,lit",
-                                                 "simulator/control.edc: lamp.text"));
+    EXPECT_THAT(unused(tree.root()),
+                ElementsAre("simulator/control.edc: lamp,lit", "simulator/control.edc: lamp.text"));
 }
 
 TEST(ThemeSources, NamesThatDoNotMatchAreFound) {
@@ -349,7 +346,9 @@ TEST(ThemeSources, NamesThatDoNotMatchAreFound) {
                                "elm_layout_theme_set(page, \"layout\", \"gone\", \"b\");\n"
                                "constexpr const char* PART_OLD = \"old\";\n");
     tree.plant("docs/THEME.md", "`elm.text` and `elm.gone` and `lost`\n");
-    EXPECT_THAT(unknownToThemes(tree.root()), ElementsAre("elm,state,lost", "elm/layout/gone/b", "lost", "old"));
-    EXPECT_THAT(undocumented(tree.root()), ElementsAre("elm,state,lost", "elm/layout/gone/b", "old"));
+    EXPECT_THAT(unknownToThemes(tree.root()),
+                ElementsAre("elm,state,lost", "elm/layout/gone/b", "lost", "old"));
+    EXPECT_THAT(undocumented(tree.root()),
+                ElementsAre("elm,state,lost", "elm/layout/gone/b", "old"));
     EXPECT_THAT(outdated(tree.root()), ElementsAre("elm.gone"));
 }
