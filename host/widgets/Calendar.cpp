@@ -3,6 +3,7 @@
 #include <Elementary.h>
 
 #include "Accessible.h"
+#include "CalendarDays.h"
 #include "CalendarTexts.h"
 #include "device/export.h"
 
@@ -31,6 +32,7 @@ DEVICE_API Evas_Object* elm_calendar_add(Evas_Object* parent) {
         if (Evas_Object* arrow = elm_layout_content_get(calendar, part))
             host::setReadTextId(arrow, textId);
     host::followLanguageInCalendar(calendar);
+    host::paleDaysGoneBy(calendar);
     return calendar;
 }
 
