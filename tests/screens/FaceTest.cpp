@@ -24,6 +24,11 @@ TEST_P(EditorFaceTest, TheEditor) {
     lookAtList(genlist(), "editor");
 }
 
+TEST_P(EditorFaceTest, WhatKeysReach) {
+    createAlarm();
+    lookAtFocus(13, "editor-keys");
+}
+
 TEST_P(EditorFaceTest, AnAlarmWithADateAndANameOfWideLetters) {
     ClockAlarmDbData alarm = storedAlarm(10, 30);
     alarm.name = "WWWWWWWWWWWWWWWWWWWW";
@@ -56,6 +61,7 @@ TEST_P(EditorFaceTest, TheDatePopup) {
     stage().settle();
     ASSERT_FALSE(stage().widgets("Elm_Calendar").empty());
     look("date");
+    lookAtFocus(5, "date-keys");
 }
 
 TEST_P(EditorFaceTest, TheDiscardPopup) {
@@ -65,6 +71,7 @@ TEST_P(EditorFaceTest, TheDiscardPopup) {
     stage().settle();
     ASSERT_TRUE(stage().shows(clockText("IDS_CLD_HEADER_DISCARD_CHANGES_ABB")));
     look("discard");
+    lookAtFocus(2, "discard-keys");
 }
 
 INSTANTIATE_TEST_SUITE_P(Languages, EditorFaceTest, FACE_LANGUAGES, languageOf);
@@ -90,6 +97,10 @@ TEST_P(CitiesFaceTest, AllCities) {
     elm_genlist_item_show(elm_genlist_last_item_get(genlist()), ELM_GENLIST_ITEM_SCROLLTO_IN);
     stage().settle();
     look("cities-end");
+}
+
+TEST_P(CitiesFaceTest, WhatKeysReach) {
+    lookAtFocus(6, "cities-keys");
 }
 
 TEST_P(CitiesFaceTest, AFingerOnTheIndex) {
@@ -145,6 +156,7 @@ TEST_P(TonesFaceTest, SeveralTones) {
     const auto lists = stage().widgets("Elm_Genlist");
     ASSERT_EQ(lists.size(), 1U);
     lookAtList(lists.front(), "tones");
+    lookAtFocus(5, "tones-keys");
 }
 
 TEST_P(TonesFaceTest, NoTones) {

@@ -115,10 +115,13 @@ class ThemeKeysTest : public ThemeStatesTest {};
 TEST_P(ThemeKeysTest, TheKeysAreSeen) {
     const Look before = look();
     stage().keySettled("Tab");
-    EXPECT_GT(look().unlike(before), 40);
+    const Look focused = look();
+    EXPECT_GT(focused.unlike(before), 40);
     // A touch of something else hides the ring.
     stage().tap(180, 20);
     EXPECT_EQ(look().unlike(before), 0);
+    stage().bezel(1);
+    EXPECT_EQ(look().unlike(focused), 0) << "the bezel leads the focus as well";
 }
 
 /** Keys never reach a radio: the row that it is in has the focus. */

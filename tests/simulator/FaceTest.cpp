@@ -66,6 +66,7 @@ TEST_P(SimulatorFaceTest, SeveralAlarms) {
     store(23, 59, "Medicine", 65);
     stage().push(new AlarmListViewController(THEME));
     lookAtList(list(), "alarms");
+    lookAtFocus(6, "alarms-keys");
 }
 
 TEST_P(SimulatorFaceTest, NoCities) {

@@ -56,6 +56,13 @@ protected:
             look(name + "-" + std::to_string(step));
         }
     }
+    /** Looks at the face after each of so many steps of the focus: rings must not be cut either. */
+    void lookAtFocus(int steps, const std::string& name) {
+        for (int step = 1; step <= steps; ++step) {
+            this->stage().keySettled("Tab");
+            look(name + "-" + std::to_string(step));
+        }
+    }
 
 private:
     std::unique_ptr<CatalogueLanguage> _language;

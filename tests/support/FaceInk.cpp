@@ -172,12 +172,25 @@ void addRectangle(std::vector<Ink>& found, Evas_Object* rectangle) {
         add(found, rectangle, "rectangle of " + groupOf(rectangle), areaOf(rectangle), false);
 }
 
+/** Shapes are cut in nine one pixel inside their round corners. What a clipper has cut has none. */
+double roundingOf(const Evas_Object* image, const InkArea& visible) {
+    int border = 0;
+    evas_object_image_border_get(image, &border, nullptr, nullptr, nullptr);
+    const InkArea whole = areaOf(image);
+    const InkArea drawn = drawnArea(image, whole);
+    const bool isCut = visible.width < drawn.width || visible.height < drawn.height;
+    return border == 0 || isCut ? 0 : (border + 1) * drawn.width / whole.width;
+}
+
 void addImage(std::vector<Ink>& found, Evas_Object* image) {
     if (isHelper(image))
         return;
     const char* file = nullptr;
     evas_object_image_file_get(image, &file, nullptr);
+    const std::size_t before = found.size();
     add(found, image, file == nullptr ? "image" : file, areaOf(image), false);
+    if (found.size() > before)
+        found.back().rounding = roundingOf(image, found.back().area);
 }
 
 void addText(std::vector<Ink>& found, Evas_Object* object) {
@@ -210,7 +223,7 @@ std::string describe(const Ink& ink) {
     };
     return ink.what + " at " + number(ink.area.x) + ", " + number(ink.area.y) + ", " +
            number(ink.area.width) + " x " + number(ink.area.height) + ", seen " +
-           std::to_string(ink.opacity) + ", reaches " + number(ink.area.reach());
+           std::to_string(ink.opacity) + ", reaches " + number(ink.reach());
 }
 
 } // namespace
@@ -219,6 +232,13 @@ double InkArea::reach() const {
     const double across = std::max(std::abs(x - MIDDLE), std::abs(x + width - MIDDLE));
     const double down = std::max(std::abs(y - MIDDLE), std::abs(y + height - MIDDLE));
     return std::hypot(across, down);
+}
+
+double Ink::reach() const {
+    const double corner = std::min({rounding, area.width / 2, area.height / 2});
+    const InkArea middles{area.x + corner, area.y + corner, area.width - 2 * corner,
+                          area.height - 2 * corner};
+    return middles.reach() + corner;
 }
 
 InkArea drawnArea(const Evas_Object* object, InkArea area) {
@@ -239,7 +259,7 @@ std::vector<Ink> inkOf(const Evas* canvas) {
 std::vector<std::string> cutByCircle(const Evas* canvas) {
     std::vector<std::string> cut;
     for (const Ink& ink : inkOf(canvas)) {
-        if (ink.opacity >= FAINT && ink.area.reach() > RADIUS)
+        if (ink.opacity >= FAINT && ink.reach() > RADIUS)
             cut.push_back(describe(ink));
     }
     return cut;

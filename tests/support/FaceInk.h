@@ -26,6 +26,10 @@ struct Ink {
     InkArea area;
     double opacity = 1; ///< 0..1
     bool isText = false;
+    double rounding = 0; ///< Radius of its corners, when it is a pill or a rounded ring.
+
+    /** The distance of its farthest point from the middle of the face. */
+    double reach() const;
 };
 
 /**
