@@ -135,6 +135,11 @@ protected:
     Evas_Object* field() { return nameRow().getNameEntryObj(); }
 };
 
+TEST_F(NameStatesTest, ItsGroundIsAsHighAsAFingerNeedsAndNoHigher) {
+    EXPECT_GE(Stage::area(field()).height, 48);
+    EXPECT_LE(Stage::area(field()).height, 52);
+}
+
 TEST_F(NameStatesTest, APressShowsAndLeavesTheFieldLit) {
     const Look before = look(field());
     pressOn(stage(), field());
