@@ -35,6 +35,12 @@ std::vector<Kind> buttons() {
           "on_gradient_bg", "popup", "calendar/decrease/default", "calendar/increase/default",
           "bg_animated", "editfield/clear"})
         all.push_back(button(style));
+    // Without a text it has an arrow.
+    all.push_back({"way back", [](Evas_Object* window) {
+                       Evas_Object* const made = elm_button_add(window);
+                       elm_object_style_set(made, "naviframe/back_btn/default");
+                       return made;
+                   }});
     return all;
 }
 

@@ -14,7 +14,6 @@
 #include "QuickPanel.h"
 #include "ToastView.h"
 #include "VolumeView.h"
-#include "WorldClockViewController.h"
 #include "clock/ClockAlarmDbModel.h"
 #include "support/Look.h"
 #include "support/Ring.h"
@@ -24,7 +23,6 @@ using simulator::AlarmListViewController;
 using simulator::QuickPanel;
 using simulator::ToastView;
 using simulator::VolumeView;
-using simulator::WorldClockViewController;
 
 namespace {
 
