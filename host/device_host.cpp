@@ -52,6 +52,7 @@ void forgetTheme() {
 void configureTouch() {
     elm_config_scale_set(1.0);
     elm_config_finger_size_set(40);
+    elm_config_longpress_timeout_set(0.6);
     elm_config_scroll_thumbscroll_enabled_set(EINA_TRUE);
     elm_config_scroll_bounce_enabled_set(EINA_TRUE);
     elm_config_scroll_bounce_friction_set(0.5);

@@ -12,7 +12,8 @@ namespace {
 
 /** As the theme tells of a finger: some widgets listen to the press, others to the click. */
 void pressButton(Evas_Object* button) {
-    for (const char* signal : {"elm,action,press", "elm,action,unpress", "elm,anim,activate"})
+    for (const char* signal :
+         {"elm,action,press", "elm,action,unpress", "elm,anim,activate", "elm,action,check,toggle"})
         elm_object_signal_emit(button, signal, theme::TOOLKIT_SOURCE);
     // The toolkit hears this one last: whoever is told may delete the button.
     elm_object_signal_emit(button, "elm,action,click", theme::TOOLKIT_SOURCE);
@@ -56,6 +57,10 @@ void activate(const FocusThing& thing) {
         elm_genlist_item_selected_set(thing.item, EINA_TRUE);
     else
         pressButton(thing.object);
+}
+
+void hold(const FocusThing& row) {
+    evas_object_smart_callback_call(row.list, "longpressed", row.item);
 }
 
 void turn(const FocusThing& thing, int steps) {

@@ -10,6 +10,8 @@ namespace host {
 
 /** @brief Does what a tap does. */
 void activate(const FocusThing& thing);
+/** @brief Does what a finger does that rests on a row. */
+void hold(const FocusThing& row);
 /** @brief Changes a value by some steps. */
 void turn(const FocusThing& thing, int steps);
 /** @brief Leads the toolkit's own focus after; characters and the end of a preview depend on it. */

@@ -4,6 +4,7 @@
 #include <string_view>
 
 #include "EvasLists.h"
+#include "ThemeNames.h"
 
 namespace host {
 
@@ -30,11 +31,21 @@ void bringIntoSight(Elm_Object_Item* item) {
     evas_smart_objects_calculate(evas_object_evas_get(elm_object_item_widget_get(item)));
 }
 
-/** A switch or a mark does what its row does. */
 bool isMark(const FocusThing& thing) {
     const char* type = elm_object_widget_type_get(thing.object);
     const std::string_view name = type ? type : "";
     return name == "Elm_Check" || name == "Elm_Radio";
+}
+
+/** A switch or a mark does what its row does, unless the row's theme tells otherwise. */
+bool actsForItself(const Evas_Object* mark) {
+    for (const Evas_Object* o = evas_object_smart_parent_get(mark); o;
+         o = evas_object_smart_parent_get(o)) {
+        if (std::string_view(evas_object_type_get(o)) == "edje" &&
+            edje_object_data_get(o, theme::DATA_OWN_FOCUS))
+            return true;
+    }
+    return false;
 }
 
 FocusBox viewOf(const Evas_Object* list) {
@@ -57,16 +68,22 @@ std::vector<FocusThing> FocusList::inItem(Elm_Object_Item* item) const {
     if (!box || !mayHaveFocus(item))
         return {};
     std::vector<FocusThing> things;
+    bool rowActs = true;
     for (FocusThing& thing : thingsIn(membersOf(_list), elm_object_mirrored_get(_list))) {
-        if (isMark(thing) || !box->contains(box->middleX(), thing.box.middleY()))
+        if (!box->contains(box->middleX(), thing.box.middleY()))
             continue;
-        thing.list = _list;
-        thing.item = item;
-        thing.place = static_cast<int>(things.size());
+        if (isMark(thing) && !actsForItself(thing.object))
+            continue;
+        rowActs = rowActs && isMark(thing);
         things.push_back(thing);
     }
-    if (things.empty() && isPressed(item))
-        things.push_back({FocusKind::Row, _list, _list, item, 0, *box});
+    if (rowActs && isPressed(item))
+        things.insert(things.begin(), {FocusKind::Row, _list, _list, item, 0, *box});
+    for (std::size_t place = 0; place < things.size(); ++place) {
+        things[place].list = _list;
+        things[place].item = item;
+        things[place].place = static_cast<int>(place);
+    }
     return things;
 }
 

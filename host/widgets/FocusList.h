@@ -15,7 +15,8 @@ namespace host {
  * @brief A look at a list as it is now.
  *
  * A row with controls in it has the focus through them. Switches and marks are no controls of their
- * own here: their row does the same. A row without data only takes room.
+ * own here: their row does the same. Where it does not, the theme says so, and the row comes before
+ * them. A row without data only takes room.
  */
 class FocusList {
 public:

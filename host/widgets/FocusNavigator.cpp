@@ -32,13 +32,14 @@ struct KeyName {
 };
 
 constexpr KeyName KEY_NAMES[] = {
-    {"Tab", FocusInput::Tab},      {"ISO_Left_Tab", FocusInput::BackTab},
-    {"Up", FocusInput::Up},        {"KP_Up", FocusInput::Up},
-    {"Down", FocusInput::Down},    {"KP_Down", FocusInput::Down},
-    {"Left", FocusInput::Left},    {"KP_Left", FocusInput::Left},
-    {"Right", FocusInput::Right},  {"KP_Right", FocusInput::Right},
-    {"Return", FocusInput::Enter}, {"KP_Enter", FocusInput::Enter},
-    {"space", FocusInput::Space},
+    {"Tab", FocusInput::Tab},        {"ISO_Left_Tab", FocusInput::BackTab},
+    {"Up", FocusInput::Up},          {"KP_Up", FocusInput::Up},
+    {"Down", FocusInput::Down},      {"KP_Down", FocusInput::Down},
+    {"Left", FocusInput::Left},      {"KP_Left", FocusInput::Left},
+    {"Right", FocusInput::Right},    {"KP_Right", FocusInput::Right},
+    {"Return", FocusInput::Enter},   {"KP_Enter", FocusInput::Enter},
+    {"space", FocusInput::Space},    {"Delete", FocusInput::Hold},
+    {"KP_Delete", FocusInput::Hold},
 };
 
 std::optional<FocusInput> inputOf(const Ecore_Event_Key& event) {
@@ -72,7 +73,7 @@ Eina_Bool thawCb(void*, Evas* canvas) {
 
 /** What lies below must not answer as well. */
 template <typename Event>
-void hold(Event& event) {
+void keepFromBelow(Event& event) {
     event.event_flags = static_cast<Evas_Event_Flags>(event.event_flags | EVAS_EVENT_FLAG_ON_HOLD);
 }
 
@@ -102,6 +103,7 @@ FocusNavigator::FocusNavigator(Evas_Object* window)
 
 // Pages go with their window, some of them before it: they cannot be touched any more.
 FocusNavigator::~FocusNavigator() {
+    endPress();
     if (_idle)
         ecore_idle_enterer_del(_idle);
     std::erase(navigators(), this);
@@ -172,30 +174,60 @@ void FocusNavigator::_wheelCb(void* data, Evas*, Evas_Object*, void* info) {
     for (int step = std::abs(event.z); step > 0; --step)
         handled = static_cast<FocusNavigator*>(data)->handle(input) || handled;
     if (handled)
-        hold(event);
+        keepFromBelow(event);
 }
 
 void FocusNavigator::_mouseDownCb(void* data, Evas*, Evas_Object*, void* info) {
     auto* self = static_cast<FocusNavigator*>(data);
     auto& event = *static_cast<Evas_Event_Mouse_Down*>(info);
     if (event.button == MIDDLE_BUTTON) {
-        hold(event);
+        keepFromBelow(event);
         // A slider would go where the pointer is, whichever button it was.
         Evas* canvas = evas_object_evas_get(self->_catcher);
         evas_event_freeze(canvas);
         evas_post_event_callback_push(canvas, thawCb, nullptr);
-        self->handle(FocusInput::Press);
+        if (!self->startPress())
+            self->handle(FocusInput::Press);
     } else {
         self->lead(false);
     }
 }
 
 void FocusNavigator::_mouseUpCb(void* data, Evas*, Evas_Object*, void* info) {
+    auto* self = static_cast<FocusNavigator*>(data);
     auto& event = *static_cast<Evas_Event_Mouse_Up*>(info);
-    if (event.button == MIDDLE_BUTTON)
-        hold(event);
-    else
-        static_cast<FocusNavigator*>(data)->touched(event.canvas.x, event.canvas.y);
+    if (event.button == MIDDLE_BUTTON) {
+        keepFromBelow(event);
+        if (self->endPress())
+            self->handle(FocusInput::Press);
+    } else {
+        self->touched(event.canvas.x, event.canvas.y);
+    }
+}
+
+bool FocusNavigator::startPress() {
+    endPress();
+    if (!enterPage() || evas_object_freeze_events_get(_root))
+        return false;
+    const auto thing = found(FocusView(_root));
+    if (!thing || thing->kind != FocusKind::Row)
+        return false;
+    _press = ecore_timer_add(elm_config_longpress_timeout_get(), _heldCb, this);
+    return true;
+}
+
+bool FocusNavigator::endPress() {
+    if (!_press)
+        return false;
+    ecore_timer_del(std::exchange(_press, nullptr));
+    return true;
+}
+
+Eina_Bool FocusNavigator::_heldCb(void* data) {
+    auto* self = static_cast<FocusNavigator*>(data);
+    self->_press = nullptr;
+    self->handle(FocusInput::Hold);
+    return ECORE_CALLBACK_CANCEL;
 }
 
 /** What is turned by hand is what the bezel turns next. */
@@ -280,6 +312,10 @@ bool FocusNavigator::act(const FocusView& view, const FocusResponse& response, F
     case FocusAction::Activate:
         lead(true);
         activate(*thing);
+        return true;
+    case FocusAction::Hold:
+        lead(true);
+        hold(*thing);
         return true;
     case FocusAction::StartTurning:
     case FocusAction::StopTurning:

@@ -45,6 +45,7 @@ private:
     static FocusNavigator* ofKeys(Ecore_Window window);
     static Eina_Bool _keyDownCb(void* data, int type, void* info);
     static Eina_Bool _idleCb(void* data);
+    static Eina_Bool _heldCb(void* data);
     static void _windowDeletedCb(void* data, Evas*, Evas_Object*, void*);
     static void _windowResizedCb(void* data, Evas*, Evas_Object* window, void*);
     static void _rootDeletedCb(void* data, Evas*, Evas_Object* root, void*);
@@ -62,6 +63,10 @@ private:
     std::optional<FocusThing> remade(const FocusView& view) const;
     void focus(const std::optional<FocusThing>& thing, bool byKeyboard);
     void startTurning(bool turning);
+    /** The bezel is pressed: a row waits whether it is held. @return False for all else. */
+    bool startPress();
+    /** The bezel is let go. @return True when a row was pressed and not held. */
+    bool endPress();
     void touched(int x, int y);
     void lead(bool keys);
     void hideRings() const;
@@ -71,6 +76,7 @@ private:
     Evas_Object* _root = nullptr; ///< The page or popup of the last input.
     std::map<Evas_Object*, Memory> _memories;
     Ecore_Idle_Enterer* _idle = nullptr; ///< While keys lead.
+    Ecore_Timer* _press = nullptr;       ///< While the bezel is pressed on a row.
     bool _turning = false;
     bool _endsTyping = false; ///< Return has just gone to a field.
 };

@@ -29,6 +29,7 @@ FocusResponse withoutFocus(FocusInput input) {
     case FocusInput::Press:
     case FocusInput::Enter:
     case FocusInput::Space:
+    case FocusInput::Hold:
         return move(FocusAction::PassOn);
     default:
         return move(FocusAction::Nearest);
@@ -121,6 +122,8 @@ FocusResponse respond(const FocusState& state, FocusInput input) {
         return state.typing ? move(FocusAction::PassOn) : press(state);
     case FocusInput::Press:
         return press(state);
+    case FocusInput::Hold:
+        return move(*state.kind == FocusKind::Row ? FocusAction::Hold : FocusAction::PassOn);
     }
     return {};
 }

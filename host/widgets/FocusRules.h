@@ -33,7 +33,8 @@ enum class FocusInput {
     Left,
     Right,
     Enter,
-    Space
+    Space,
+    Hold, ///< A press that rests.
 };
 
 enum class FocusAction {
@@ -44,6 +45,7 @@ enum class FocusAction {
     Next,
     Previous,
     Activate,
+    Hold, ///< As a finger that rests on it.
     StartTurning,
     StopTurning,
     Turn,

@@ -58,6 +58,8 @@ inline constexpr int MESSAGE_INDENT = 1;
 inline constexpr const char* PART_LIST_ROWS = "elm.swallow.content";
 /** Names the parts of a row that must not be cut by the rim, in the theme's data. */
 inline constexpr const char* DATA_RIM = "rim";
+/** In the theme's data of a row: its switch does something else than the row. */
+inline constexpr const char* DATA_OWN_FOCUS = "own_focus";
 /** A float: how far the upper end of a list is softened, 0 to 1. */
 inline constexpr int MESSAGE_FADE = 1;
 
