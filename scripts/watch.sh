@@ -5,6 +5,7 @@
 
 WATCH_CREATE="180 325"      # button of the alarm list
 WATCH_FIRST_ALARM="180 165" # first row of the alarm list
+WATCH_FIRST_SWITCH="285 188" # its switch
 WATCH_WORLD_CLOCK="180 60"  # title's button of either list
 WATCH_CANCEL="124 60"       # title buttons of the editor
 WATCH_DONE="236 60"

@@ -1,24 +1,60 @@
 #include "AlarmListItem.h"
 
 #include <cstring>
+#include <ctime>
 #include <string_view>
 #include <utility>
 
+#include <unicode/ubidi.h>
+#include <unicode/unistr.h>
+
 #include "AlarmListText.h"
+#include "AlarmOrder.h"
 #include "TimeText.h"
 
 #define LOG_TAG "clock-sim"
 #include "base/Log.h"
 
 namespace simulator {
+namespace {
 
-AlarmListItem::AlarmListItem(ClockAlarmDbData alarm, bool twelveHour, SelectedFunction selected)
-    : _alarm(std::move(alarm)), _twelveHour(twelveHour), _selected(std::move(selected)) {}
+/** A line's own direction, and within it text of the other one. */
+constexpr const char* LEFT_TO_RIGHT_LINE = "\u200e\u202b";
+constexpr const char* RIGHT_TO_LEFT_LINE = "\u200f\u202a";
+constexpr const char* LINE_END = "\u202c";
+
+/** A line begins where the row does, also when its own letters run the other way. */
+std::string lineMarkup(const std::string& text) {
+    const auto letters = icu::UnicodeString::fromUTF8(text);
+    const auto direction = ubidi_getBaseDirection(letters.getBuffer(), letters.length());
+    const bool mirrored = elm_config_mirrored_get() != EINA_FALSE;
+    if (mirrored && direction == UBIDI_LTR)
+        return RIGHT_TO_LEFT_LINE + markupOf(text) + LINE_END;
+    if (!mirrored && direction == UBIDI_RTL)
+        return LEFT_TO_RIGHT_LINE + markupOf(text) + LINE_END;
+    return markupOf(text);
+}
+
+/** Moves the knob there; nobody is told that it has changed. */
+void turn(Evas_Object* check, bool on) {
+    elm_object_signal_emit(check, on ? "elm,activate,check,on" : "elm,activate,check,off", "elm");
+    elm_check_state_set(check, on ? EINA_TRUE : EINA_FALSE);
+}
+
+std::string tagged(const std::string& tag, const std::string& markup) {
+    return "<" + tag + ">" + markup + "</" + tag + ">";
+}
+
+} // namespace
+
+AlarmListItem::AlarmListItem(ClockAlarmDbData alarm, AlarmRowLook look, AlarmRowActions actions)
+    : _alarm(std::move(alarm)), _look(std::move(look)), _actions(std::move(actions)) {}
 
 Elm_Genlist_Item_Class* AlarmListItem::getItemClassNew() {
     Elm_Genlist_Item_Class* itemClass = elm_genlist_item_class_new();
-    itemClass->item_style = "simulator.time";
+    itemClass->item_style = "simulator.alarm";
     itemClass->func.text_get = _textGetCb;
+    itemClass->func.content_get = _contentGetCb;
     itemClass->func.state_get = _stateGetCb;
     itemClass->func.del = deleteCb;
     return itemClass;
@@ -26,8 +62,28 @@ Elm_Genlist_Item_Class* AlarmListItem::getItemClassNew() {
 
 void AlarmListItem::onSelect(Elm_Object_Item* item) {
     elm_genlist_item_selected_set(item, EINA_FALSE);
-    if (_selected)
-        _selected(_alarm.id);
+    if (_actions.tapped)
+        _actions.tapped(_alarm.id);
+}
+
+void AlarmListItem::onHold() {
+    if (_actions.held)
+        _actions.held(_alarm.id);
+}
+
+void AlarmListItem::show(const ClockAlarmDbData& alarm, const AlarmRowLook& look) {
+    _alarm = alarm;
+    _look = look;
+    elm_genlist_item_fields_update(getElmObjectItem(), "*", ELM_GENLIST_ITEM_FIELD_TEXT);
+    elm_genlist_item_fields_update(getElmObjectItem(), "*", ELM_GENLIST_ITEM_FIELD_STATE);
+    for (Evas_Object* check : _switches.all()) {
+        if ((elm_check_state_get(check) != EINA_FALSE) != isOn())
+            turn(check, isOn());
+    }
+}
+
+bool AlarmListItem::isOn() const {
+    return upcomingRing(_alarm, std::time(nullptr)).has_value();
 }
 
 char* AlarmListItem::_textGetCb(void* data, Evas_Object*, const char* part) {
@@ -36,17 +92,56 @@ char* AlarmListItem::_textGetCb(void* data, Evas_Object*, const char* part) {
         LOG_ERROR("Data is NULL !!");
         return nullptr;
     }
-    const std::string_view name(part);
-    if (name == "row.time")
-        return strdup(alarmTimeText(self->_alarm, self->_twelveHour).c_str());
-    if (name == "row.about")
-        return strdup(self->aboutMarkup().c_str());
-    return nullptr;
+    return strdup(self->textOf(part).c_str());
+}
+
+std::string AlarmListItem::textOf(const std::string& part) const {
+    if (part == "row.next")
+        return _look.next;
+    if (part == "row.time")
+        return alarmTimeText(_alarm, _look.twelveHour);
+    return part == "row.about" ? aboutMarkup() : "";
 }
 
 std::string AlarmListItem::aboutMarkup() const {
-    const std::string days = markupOf(alarmDaysText(_alarm));
-    return _alarm.name.empty() ? days : "<label>" + markupOf(_alarm.name) + "</label><br>" + days;
+    const bool on = isOn();
+    const std::string days = lineMarkup(alarmDaysText(_alarm, std::time(nullptr)));
+    const std::string about = on ? days : tagged("off", days);
+    if (_alarm.name.empty())
+        return about;
+    return tagged(on ? "label" : "label_off", lineMarkup(_alarm.name)) + "<br>" + about;
+}
+
+Evas_Object* AlarmListItem::_contentGetCb(void* data, Evas_Object* genlist, const char* part) {
+    auto* self = static_cast<AlarmListItem*>(data);
+    if (self == nullptr || part == nullptr) {
+        LOG_ERROR("Data is NULL !!");
+        return nullptr;
+    }
+    return std::string_view(part) == "row.switch" ? self->createSwitch(genlist) : nullptr;
+}
+
+Evas_Object* AlarmListItem::createSwitch(Evas_Object* genlist) {
+    Evas_Object* check = elm_check_add(genlist);
+    elm_object_style_set(check, "on&off");
+    elm_check_state_set(check, isOn() ? EINA_TRUE : EINA_FALSE);
+    // A touch of the switch is none of the row.
+    evas_object_repeat_events_set(check, EINA_FALSE);
+    evas_object_propagate_events_set(check, EINA_FALSE);
+    evas_object_smart_callback_add(check, "changed", _switchedCb, this);
+    _switches.add(check);
+    evas_object_show(check);
+    return check;
+}
+
+void AlarmListItem::_switchedCb(void* data, Evas_Object* check, void*) {
+    const auto* self = static_cast<AlarmListItem*>(data);
+    if (self == nullptr) {
+        LOG_ERROR("Data is NULL !!");
+        return;
+    }
+    if (self->_actions.switched)
+        self->_actions.switched(self->_alarm.id, elm_check_state_get(check) != EINA_FALSE);
 }
 
 Eina_Bool AlarmListItem::_stateGetCb(void* data, Evas_Object*, const char*) {
@@ -55,7 +150,7 @@ Eina_Bool AlarmListItem::_stateGetCb(void* data, Evas_Object*, const char*) {
         LOG_ERROR("Data is NULL !!");
         return EINA_FALSE;
     }
-    return self->_alarm.enable == 1 ? EINA_TRUE : EINA_FALSE;
+    return self->isOn() ? EINA_TRUE : EINA_FALSE;
 }
 
 } // namespace simulator

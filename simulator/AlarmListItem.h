@@ -4,33 +4,58 @@
  */
 #pragma once
 
+#include <cstdint>
 #include <functional>
 #include <string>
 
-#include "app_assist/WGenlistItem.h"
+#include "ListRow.h"
+#include "LiveWidgets.h"
 #include "clock/ClockAlarmDbData.h"
 
 namespace simulator {
 
-/** @brief A row with an alarm's time, label and days. */
-class AlarmListItem : public app_assist::WGenlistItem {
-public:
-    /** Receives the id of the alarm that a person has tapped. */
-    using SelectedFunction = std::function<void(int id)>;
+/** What a person can do with a row of the alarm list. Each gets the alarm's id. */
+struct AlarmRowActions {
+    std::function<void(int id)> tapped;
+    std::function<void(int id)> held;
+    std::function<void(int id, bool on)> switched;
+};
 
-    AlarmListItem(ClockAlarmDbData alarm, bool twelveHour, SelectedFunction selected);
+/** How a row of the alarm list is drawn. */
+struct AlarmRowLook {
+    bool twelveHour = false;
+    std::string next; ///< How far away its ring is; only of the alarm that rings next.
+
+    bool operator==(const AlarmRowLook&) const = default;
+};
+
+/** @brief A row with an alarm's time, label and days, and a switch. */
+class AlarmListItem : public ListRow {
+public:
+    AlarmListItem(ClockAlarmDbData alarm, AlarmRowLook look, AlarmRowActions actions);
 
     Elm_Genlist_Item_Class* getItemClassNew() override;
     void onSelect(Elm_Object_Item* item) override;
+    void onHold() override;
+
+    /** @brief Shows the alarm as it is now; a switch that stands otherwise moves there. */
+    void show(const ClockAlarmDbData& alarm, const AlarmRowLook& look);
 
 private:
     static char* _textGetCb(void* data, Evas_Object* genlist, const char* part);
+    static Evas_Object* _contentGetCb(void* data, Evas_Object* genlist, const char* part);
     static Eina_Bool _stateGetCb(void* data, Evas_Object* genlist, const char* part);
+    static void _switchedCb(void* data, Evas_Object* check, void* info);
+    Evas_Object* createSwitch(Evas_Object* genlist);
+    std::string textOf(const std::string& part) const;
     std::string aboutMarkup() const;
+    /** Whether it is going to ring: one whose day is over is as good as switched off. */
+    bool isOn() const;
 
     ClockAlarmDbData _alarm;
-    bool _twelveHour;
-    SelectedFunction _selected;
+    AlarmRowLook _look;
+    AlarmRowActions _actions;
+    LiveWidgets _switches;
 };
 
 } // namespace simulator

@@ -1,6 +1,7 @@
 #include "ToastView.h"
 
 #include <cstdlib>
+#include <utility>
 
 #include <Elementary.h>
 
@@ -42,17 +43,21 @@ void ToastView::_toastCb(const char* message, void* data) {
 }
 
 void ToastView::post(const std::string& text) {
+    // Who does the same again wants to read it once.
+    if (_timer && text == (_waiting.empty() ? _shown : _waiting.back()))
+        return;
     _waiting.push_back(text);
     if (!_timer)
         showNext();
 }
 
 void ToastView::showNext() {
-    char* markup = elm_entry_utf8_to_markup(_waiting.front().c_str());
+    _shown = std::move(_waiting.front());
+    _waiting.pop_front();
+    char* markup = elm_entry_utf8_to_markup(_shown.c_str());
     elm_object_part_text_set(_layout, "toast.text", markup);
     std::free(markup);
-    app_assist::announce(_layout, _waiting.front());
-    _waiting.pop_front();
+    app_assist::announce(_layout, _shown);
     elm_object_signal_emit(_layout, "toast,show", "simulator");
     _timer.reset(ecore_timer_add(TOAST_SECONDS, _timeOverCb, this));
 }

@@ -26,7 +26,8 @@ public:
     ToastView(const ToastView&) = delete;
     ToastView& operator=(const ToastView&) = delete;
 
-    /** @brief Shows a text, or keeps it until the texts before it have been shown. */
+    /** @brief Shows a text, or keeps it until the texts before it have been shown.
+     * One that reads as the one before is shown once. */
     void post(const std::string& text);
 
 private:
@@ -38,6 +39,7 @@ private:
     void showNext();
 
     Evas_Object* _layout;
+    std::string _shown;
     std::deque<std::string> _waiting;
     std::unique_ptr<Ecore_Timer, TimerDeleter> _timer;
 };

@@ -28,6 +28,10 @@ Elm_Genlist_Item_Class* WorldClockItem::getItemClassNew() {
 
 void WorldClockItem::onSelect(Elm_Object_Item* item) {
     elm_genlist_item_selected_set(item, EINA_FALSE);
+    onHold();
+}
+
+void WorldClockItem::onHold() {
     if (_selected)
         _selected(_city);
 }

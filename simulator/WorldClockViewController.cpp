@@ -1,17 +1,15 @@
 #include "WorldClockViewController.h"
 
 #include <algorithm>
-#include <ctime>
+#include <iterator>
 #include <utility>
 
 #include "TimeText.h"
 #include "WorldClockAddCityViewController.h"
 #include "WorldClockItem.h"
 #include "app_assist/WNaviframeController.h"
-#include "app_assist/WPopupController.h"
 #include "clock/ClockText.h"
 #include "clock/ClockWorldClockDbModel.h"
-#include "rules/RingDay.h"
 
 #define LOG_TAG "clock-sim"
 #include "base/Log.h"
@@ -35,36 +33,8 @@ const char* WorldClockViewController::getClassName() const {
     return "WorldClockViewController";
 }
 
-void WorldClockViewController::onCreated() {
-    ListPage::onCreated();
-    waitForNextMinute();
-}
-
-void WorldClockViewController::onDestroy() {
-    _minuteTimer.reset();
-    ListPage::onDestroy();
-}
-
 void WorldClockViewController::onOtherTapped() {
     popOut();
-}
-
-void WorldClockViewController::waitForNextMinute() {
-    _minuteTimer.reset(
-        ecore_timer_add(rules::secondsToNextMinute(std::time(nullptr)), _minuteCb, this));
-}
-
-Eina_Bool WorldClockViewController::_minuteCb(void* data) {
-    auto* self = static_cast<WorldClockViewController*>(data);
-    if (self == nullptr) {
-        LOG_ERROR("Data is NULL !!");
-        return ECORE_CALLBACK_CANCEL;
-    }
-    self->updateRows();
-    // The main loop deletes the timer of a callback that cancels.
-    static_cast<void>(self->_minuteTimer.release());
-    self->waitForNextMinute();
-    return ECORE_CALLBACK_CANCEL;
 }
 
 void WorldClockViewController::addCity() {
@@ -78,54 +48,20 @@ void WorldClockViewController::addCity() {
 }
 
 void WorldClockViewController::askToRemove(const ClockWorldClockDbData& city) {
-    if (!isOnTop())
-        return;
-    auto* popup = new app_assist::WPopupController();
-    popup->setOnAddProperties([](Evas_Object* o) {
-        elm_popup_align_set(o, ELM_NOTIFY_ALIGN_FILL, 1.0);
-        elm_object_domain_translatable_part_text_set(o, nullptr, nullptr,
-                                                     "IDS_WCL_POP_REMOVE_CITY_FROM_LIST");
-    });
-    const auto labelled = [](const char* id) {
-        return [id](Evas_Object* button) {
-            elm_object_domain_translatable_text_set(button, nullptr, id);
-        };
-    };
-    popup->addButton("", {}, labelled("IDS_COM_SK_CANCEL"));
-    popup->addButton(
-        "", [this, city](bool*) { remove(city); }, labelled("IDS_COM_SK_REMOVE"));
-    attachPopup(popup);
-    _question = popup->getWeakPtr();
-    _questionedCity = city.city;
-    nameCity();
-}
-
-void WorldClockViewController::nameCity() {
-    elm_object_part_text_set(_question->getEvasObj(), "title,text",
-                             markupOf(clockText(_questionedCity.c_str())).c_str());
-}
-
-void WorldClockViewController::onEvent(EventType type) {
-    ListPage::onEvent(type);
-    if (type == LANGUAGE_CHANGED && _question)
-        nameCity();
+    ListPage::askToRemove({.title = [city] { return clockText(city.city.c_str()); },
+                           .name = "",
+                           .textId = "IDS_WCL_POP_REMOVE_CITY_FROM_LIST"},
+                          [this, city] { remove(city); });
 }
 
 void WorldClockViewController::remove(const ClockWorldClockDbData& city) {
+    std::vector<int> keys;
+    std::transform(_cities.begin(), _cities.end(), std::back_inserter(keys),
+                   [](const ClockWorldClockDbData& other) { return other.index; });
     // The model tells why it cannot.
     ClockWorldClockDbModel().removeWorldClockDbRecord(city);
-    _shownKey = neighbourOf(city);
+    _shownKey = neighbourOf(keys, city.index).value_or(NONE);
     scheduleRefresh();
-}
-
-int WorldClockViewController::neighbourOf(const ClockWorldClockDbData& city) const {
-    const auto place =
-        std::find_if(_cities.begin(), _cities.end(), [&city](const ClockWorldClockDbData& other) {
-            return other.index == city.index;
-        });
-    if (place == _cities.end() || _cities.size() == 1)
-        return NONE;
-    return place + 1 == _cities.end() ? (place - 1)->index : (place + 1)->index;
 }
 
 Elm_Object_Item* WorldClockViewController::appendRows() {

@@ -4,15 +4,10 @@
  */
 #pragma once
 
-#include <memory>
 #include <string>
 #include <vector>
 
-#include <Ecore.h>
-
 #include "ListPage.h"
-#include "app_assist/WViewController.h"
-#include "app_assist/WWeakPtr.h"
 #include "clock/ClockWorldClockDbData.h"
 
 namespace simulator {
@@ -30,34 +25,18 @@ public:
     void addCity();
 
 protected:
-    void onCreated() override;
-    void onDestroy() override;
-    void onEvent(EventType type) override;
     Elm_Object_Item* appendRows() override;
     void onAddTapped() override { addCity(); }
     void onOtherTapped() override;
 
 private:
-    struct TimerDeleter {
-        void operator()(Ecore_Timer* timer) const { ecore_timer_del(timer); }
-    };
-    static Eina_Bool _minuteCb(void* data);
-    void waitForNextMinute();
     /** Asks whether a city is to leave the list. */
     void askToRemove(const ClockWorldClockDbData& city);
     void remove(const ClockWorldClockDbData& city);
-    /** Writes which city the question is about. */
-    void nameCity();
-
-    /** The city below another one, or above it when it is the last. */
-    int neighbourOf(const ClockWorldClockDbData& city) const;
 
     static constexpr int NONE = -1; ///< No city's key.
     std::vector<ClockWorldClockDbData> _cities;
     int _shownKey = NONE; ///< The city that the next refresh brings into view.
-    std::unique_ptr<Ecore_Timer, TimerDeleter> _minuteTimer;
-    app_assist::WWeakPtr<app_assist::WViewController> _question;
-    std::string _questionedCity; ///< Message identifier.
 };
 
 } // namespace simulator

@@ -90,6 +90,19 @@ check "Its name is the same" is "$(column name)" 'Gym & <tea>'
 check "A second toast came" watch_wait 10 toasts_are 2
 picture 11-changed
 
+# It is switched off and on in the list.
+check "The switch of the alarm is tapped" watch_tap $WATCH_FIRST_SWITCH
+check "The alarm is off" watch_wait 10 column_is enable 0
+check "Its ring is cancelled" is "$(ask 'SELECT enabled FROM alarm_schedule')" 0
+check "The indicator counts no alarm" grep -rqsE '\b0$' "$XDG_RUNTIME_DIR" --include='*alarm'
+picture 11a-off
+check "The list shows it" differs 11-changed 11a-off
+check "The switch is tapped again" watch_tap $WATCH_FIRST_SWITCH
+check "The alarm is on" watch_wait 10 column_is enable 1
+check "It rings again" is "$(ask 'SELECT enabled, hour, minute FROM alarm_schedule')" '1|7|40'
+check "A third toast tells when" watch_wait 10 toasts_are 3
+check "Nothing but the alarm itself is left" is "$(column 'id, hour, min, name')" "$id|7|40|Gym & <tea>"
+
 # Nothing is changed, nothing is asked.
 second=$(stored)
 check "The alarm is tapped once more" watch_tap $WATCH_FIRST_ALARM

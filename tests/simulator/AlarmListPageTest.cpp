@@ -1,68 +1,25 @@
 // The clock application's first page.
 
-#include "AlarmListViewController.h"
-
 #include <string>
 
-#include <Elementary.h>
-
-#include "clock/ClockAlarmDbModel.h"
-#include "support/ScreenTest.h"
-
-using simulator::AlarmListViewController;
+#include "AlarmListFixture.h"
 
 namespace {
 
 constexpr const char* TIME_FORM = "db/menu_widget/regionformat_time1224";
-const std::string THEME = CLOCK_RESOURCE_DIR "/edje/simulator.edj";
 
-class AlarmListPageTest : public ScreenTest {
+class AlarmListPageTest : public AlarmListFixture {
 protected:
-    void SetUp() override {
-        ScreenTest::SetUp();
-        elm_theme_extension_add(nullptr, THEME.c_str());
-    }
     void TearDown() override {
         takeStageDown();
-        elm_theme_extension_del(nullptr, THEME.c_str());
         // What the editor says about a new alarm's empty name is its own affair.
         takeErrors();
-        ScreenTest::TearDown();
-    }
-
-    void openPage() {
-        page = new AlarmListViewController(THEME);
-        stage().push(page);
+        AlarmListFixture::TearDown();
     }
     static ClockAlarmDbData store(int hour, int minute, const std::string& name = "") {
-        ClockAlarmDbData alarm;
-        alarm.leading = 0;
-        alarm.hour = hour;
-        alarm.min = minute;
-        alarm.name = name;
-        alarm.enable = 1;
-        alarm.repeatWeekly = 2;
-        alarm.repeatOnce = 0;
-        ClockAlarmDbModel model;
-        alarm.id = model.reserveAlarmId();
-        EXPECT_TRUE(model.insertAlarmData(alarm));
-        return alarm;
+        constexpr int MONDAY = 2;
+        return add(hour, minute, true, MONDAY, name);
     }
-    unsigned pages() {
-        Eina_List* const list = elm_naviframe_items_get(stage().naviframe().getEvasObj());
-        const unsigned count = eina_list_count(list);
-        eina_list_free(list);
-        return count;
-    }
-    /** All that can be read on the face, one line each. */
-    std::string readFace() {
-        std::string all;
-        for (const FoundText& found : stage().texts())
-            all += found.text + "\n";
-        return all;
-    }
-
-    AlarmListViewController* page = nullptr;
 };
 
 } // namespace

@@ -39,15 +39,16 @@ protected:
     }
 
     Evas_Object* list() { return stage().widgets("Elm_Genlist").front(); }
-    static void store(int hour, int minute, const std::string& name, int weekdays) {
+    static void store(int hour, int minute, const std::string& name, int weekdays, bool on = true) {
         ClockAlarmDbData alarm;
         alarm.leading = 0;
         alarm.hour = hour;
         alarm.min = minute;
         alarm.name = name;
-        alarm.enable = 1;
+        alarm.enable = on ? 1 : 0;
         alarm.repeatWeekly = weekdays;
-        alarm.repeatOnce = 0;
+        alarm.repeatOnce = weekdays == 0 ? 1 : 0;
+        alarm.timeZone = "Europe/Berlin";
         ClockAlarmDbModel model;
         alarm.id = model.reserveAlarmId();
         ASSERT_TRUE(model.insertAlarmData(alarm));
@@ -64,9 +65,22 @@ TEST_P(SimulatorFaceTest, SeveralAlarms) {
     store(10, 30, "WWWWWWWWWWWWWWWWWWWW", 62);
     store(22, 45, "", 127);
     store(23, 59, "Medicine", 65);
+    store(12, 55, "", 0, false);
+    store(12, 55, "WWWWWWWWWWWWWWWWWWWW", 62, false);
     stage().push(new AlarmListViewController(THEME));
     lookAtList(list(), "alarms");
     lookAtFocus(6, "alarms-keys");
+}
+
+TEST_P(SimulatorFaceTest, AnAlarmIsRemoved) {
+    store(22, 45, "WWWWWWWWWWWWWWWWWWWW", 127);
+    stage().push(new AlarmListViewController(THEME));
+    stage().press(180, 180);
+    Stage::advance(0.8);
+    stage().release();
+    stage().settle();
+    ASSERT_EQ(stage().widgets("Elm_Popup").size(), 1U);
+    look("alarm-removal");
 }
 
 TEST_P(SimulatorFaceTest, NoCities) {

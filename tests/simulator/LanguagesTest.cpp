@@ -93,15 +93,14 @@ protected:
         };
         std::string span;
         ClockStringUtil::generateAlertOffsetToastPopupText(6, 23, 59, span);
-        return {span,
-                format("IDS_CLOCK_TPOP_ALARM_ALREADY_SET_FOR_PS_EXISTING_ALARM_UPDATED",
-                       {"10:45 PM"}),
-                format("IDS_CLOCK_TPOP_CANT_SAVE_MORE_THAN_PD_CHARACTERS", {20}),
-                format("IDS_CLOCK_TPOP_CANT_ENTER_MORE_THAN_PD_CHARACTERS", {20}),
-                clockText("IDS_CLOCK_TPOP_CANT_SET_ALARMS_FOR_TIME_IN_PAST_TOMORROWS_DATE_SET"),
-                clockText("IDS_CLOCK_POP_LOCATION_SERVICES_NOT_AVAILABLE"),
-                format("IDS_CLOCK_BODY_PS_ALREADY_EXISTS",
-                       {"San Fernando del Valle de Catamarca"})};
+        return {
+            span,
+            format("IDS_CLOCK_TPOP_ALARM_ALREADY_SET_FOR_PS_EXISTING_ALARM_UPDATED", {"10:45 PM"}),
+            format("IDS_CLOCK_TPOP_CANT_SAVE_MORE_THAN_PD_CHARACTERS", {20}),
+            format("IDS_CLOCK_TPOP_CANT_ENTER_MORE_THAN_PD_CHARACTERS", {20}),
+            clockText("IDS_CLOCK_TPOP_CANT_SET_ALARMS_FOR_TIME_IN_PAST_TOMORROWS_DATE_SET"),
+            clockText("IDS_CLOCK_POP_LOCATION_SERVICES_NOT_AVAILABLE"),
+            format("IDS_CLOCK_BODY_PS_ALREADY_EXISTS", {"San Fernando del Valle de Catamarca"})};
     }
     void take(const std::string& name) { stage().screenshot("simulator-" + GetParam() + name); }
     bool shows(const char* id) { return stage().shows(clockText(id)); }

@@ -42,6 +42,21 @@ TEST_F(ToastViewTest, aSecondToastWaitsForTheFirst) {
     EXPECT_FALSE(shows("Second"));
 }
 
+TEST_F(ToastViewTest, theSameTextAgainDoesNotWait) {
+    ToastView toasts(stage().window(), THEME);
+    for (int times = 0; times < 5; ++times)
+        toasts.post("First");
+    toasts.post("Second");
+    toasts.post("Second");
+    Stage::advance(4);
+    EXPECT_TRUE(shows("Second"));
+    Stage::advance(3);
+    EXPECT_FALSE(shows("Second"));
+    toasts.post("Second");
+    Stage::advance(1);
+    EXPECT_TRUE(shows("Second")) << "a toast that has gone may come again";
+}
+
 TEST_F(ToastViewTest, aLongToastStaysInsideTheCircle) {
     ToastView toasts(stage().window(), THEME);
     toasts.post("An alarm is already set for 10:45 PM. Existing alarm updated.");

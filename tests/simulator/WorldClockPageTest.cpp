@@ -234,6 +234,21 @@ TEST_F(WorldClockPageTest, aCityIsRemovedOnceAPersonSaysSo) {
     EXPECT_THAT(shown({"Singapore", "Kathmandu"}), ElementsAre("Kathmandu"));
 }
 
+TEST_F(WorldClockPageTest, aCityThatIsHeldIsAskedForToo) {
+    select(SINGAPORE, 0);
+    openPage();
+    const auto time = stage().findText("16:41");
+    ASSERT_TRUE(time);
+    stage().press(time->area.middle().x, time->area.middle().y);
+    Stage::advance(0.8);
+    EXPECT_TRUE(stage().shows("Remove")) << readFace();
+    stage().release();
+    stage().settle();
+    EXPECT_TRUE(stage().shows("Remove")) << "the finger that goes up answers nothing";
+    tapText("Remove");
+    EXPECT_THAT(selected(), ElementsAre());
+}
+
 TEST_F(WorldClockPageTest, theLastCityThatGoesLeavesAnEmptyList) {
     select(SINGAPORE, 0);
     openPage();
