@@ -4,6 +4,7 @@
 #include <sstream>
 #include <string>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 #include <dlfcn.h>
@@ -28,7 +29,10 @@ namespace {
 constexpr double MARGIN = 2;
 /** So far a list is scrolled when its upper end has become soft. */
 constexpr double FADE_WAY = 16;
+/** So long a list stands before the row in the middle may show what it has no room for. */
+constexpr double REST_SECONDS = 1.0;
 constexpr const char* ROW_KEY = "device-host.genlist.row";
+constexpr const char* LIST_KEY = "device-host.genlist.rest";
 
 struct Area {
     int x = 0;
@@ -228,8 +232,64 @@ void eachRow(const Evas_Object* list, const Visit& visit) {
     eina_list_free(members);
 }
 
+/** Whether a list stands. */
+struct ListRest {
+    Evas_Object* list = nullptr;
+    Ecore_Timer* timer = nullptr;
+    bool isTold = false;
+};
+
+bool isInTheMiddle(const Evas_Object* row, double middle) {
+    const Area area = areaOf(row);
+    return area.y <= middle && middle < area.y + area.height;
+}
+
+Eina_Bool listRests(void* data) {
+    auto* rest = static_cast<ListRest*>(data);
+    const Area seen = areaOf(rest->list);
+    const double middle = std::clamp(faceOf(rest->list).middleY, 1.0 * seen.y,
+                                     std::max(1.0 * seen.y, seen.y + seen.height - 1.0));
+    rest->timer = nullptr;
+    rest->isTold = true;
+    eachRow(rest->list, [&](Evas_Object* row) {
+        if (isInTheMiddle(row, middle))
+            edje_object_signal_emit(row, host::theme::SIGNAL_ROW_CENTRED,
+                                    host::theme::SIGNAL_SOURCE);
+    });
+    return ECORE_CALLBACK_CANCEL;
+}
+
+void listMoves(const Evas_Object* list) {
+    auto* rest = static_cast<ListRest*>(evas_object_data_get(list, LIST_KEY));
+    if (!rest)
+        return;
+    if (std::exchange(rest->isTold, false))
+        eachRow(list, [](Evas_Object* row) {
+            edje_object_signal_emit(row, host::theme::SIGNAL_ROW_MOVED, host::theme::SIGNAL_SOURCE);
+        });
+    if (rest->timer)
+        ecore_timer_reset(rest->timer);
+    else
+        rest->timer = ecore_timer_add(REST_SECONDS, listRests, rest);
+}
+
+void listDeleted(void* data, Evas*, Evas_Object* list, void*) {
+    const std::unique_ptr<ListRest> rest(static_cast<ListRest*>(data));
+    evas_object_data_del(list, LIST_KEY);
+    if (rest->timer)
+        ecore_timer_del(rest->timer);
+}
+
+void watchRest(Evas_Object* list) {
+    auto rest = std::make_unique<ListRest>();
+    rest->list = list;
+    evas_object_data_set(list, LIST_KEY, rest.get());
+    evas_object_event_callback_add(list, EVAS_CALLBACK_DEL, listDeleted, rest.release());
+}
+
 /** Rows end softly below what stands above a list, once there are some there. */
 void listScrolled(void*, Evas_Object* list, void*) {
+    listMoves(list);
     int y = 0;
     elm_scroller_region_get(list, nullptr, &y, nullptr, nullptr);
     Edje_Message_Float message = {std::clamp(y / FADE_WAY, 0.0, 1.0)};
@@ -256,6 +316,7 @@ void drawAnew(const Evas_Object* list) {
 void rowRealized(void*, Evas_Object* list, void*) {
     eachRow(list, adopt);
     drawAnew(list);
+    listMoves(list);
 }
 
 void listChanged(void*, Evas*, Evas_Object* list, void*) {
@@ -275,6 +336,7 @@ DEVICE_API Evas_Object* elm_genlist_add(Evas_Object* parent) {
         return nullptr;
     }
     host::nameRowsForReaders(list);
+    watchRest(list);
     evas_object_smart_callback_add(list, "realized", rowRealized, nullptr);
     evas_object_smart_callback_add(list, "scroll", listScrolled, nullptr);
     evas_object_event_callback_add(list, EVAS_CALLBACK_MOVE, listChanged, nullptr);

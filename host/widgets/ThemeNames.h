@@ -60,6 +60,9 @@ inline constexpr const char* PART_LIST_ROWS = "elm.swallow.content";
 inline constexpr const char* DATA_RIM = "rim";
 /** In the theme's data of a row: its switch does something else than the row. */
 inline constexpr const char* DATA_OWN_FOCUS = "own_focus";
+/** To a row, from "device": it rests in the middle of the face, or no longer does. */
+inline constexpr const char* SIGNAL_ROW_CENTRED = "device,state,centred";
+inline constexpr const char* SIGNAL_ROW_MOVED = "device,state,moved";
 /** A float: how far the upper end of a list is softened, 0 to 1. */
 inline constexpr int MESSAGE_FADE = 1;
 

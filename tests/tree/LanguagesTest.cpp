@@ -1,5 +1,6 @@
 // The catalogues of all languages have what the English one has.
 
+#include <algorithm>
 #include <array>
 #include <map>
 #include <optional>
@@ -26,6 +27,14 @@ constexpr std::array HEADER_FIELDS = {
     "Project-Id-Version", "PO-Revision-Date", "Last-Translator",
     "Language-Team",      "MIME-Version",     "Plural-Forms",
     "Language",           "Content-Type",     "Content-Transfer-Encoding"};
+
+/** Words that a language shares with English. */
+const std::map<std::string, std::vector<std::string>> SHARED = {
+    {"de", {"IDS_ALM_BODY_ALERTTYEP_VIBRATION"}},
+    {"fr", {"IDS_COM_BODY_DATE", "IDS_ALM_BODY_TYPE"}},
+    {"pl", {"IDS_COM_BODY_ALARM"}},
+    {"tr", {"IDS_COM_BODY_ALARM"}},
+};
 
 struct Entry {
     std::string id;
@@ -194,6 +203,21 @@ std::string headerOf(const Reader& catalogue) {
     return hasHeader ? catalogue.entries.front().text : "";
 }
 
+/** What was copied and not translated. A text of conversions alone has nothing to translate. */
+void checkWords(const std::string& language, const std::vector<Entry>& english,
+                const std::vector<Entry>& entries, Faults& faults) {
+    std::map<std::string, std::string> words;
+    for (const Entry& entry : english)
+        words[entry.id] = entry.text;
+    const auto shared = SHARED.find(language);
+    for (const Entry& entry : entries) {
+        const bool isShared = shared != SHARED.end() &&
+                              std::ranges::find(shared->second, entry.id) != shared->second.end();
+        if (!entry.id.empty() && !isShared && !entry.text.empty() && words[entry.id] == entry.text)
+            faults.push_back(entry.id + " is English");
+    }
+}
+
 /** What is wrong with the catalogues of a tree. */
 Faults catalogueFaults(const fs::path& root) {
     const Reader english(contentsOf(root / "po/en.po"));
@@ -204,6 +228,7 @@ Faults catalogueFaults(const fs::path& root) {
         Faults faults = reader.faults;
         checkHeader(language, headerOf(reader), faults);
         checkEntries(english.entries, reader.entries, faults);
+        checkWords(language, english.entries, reader.entries, faults);
         for (const auto& fault : faults)
             all.push_back(std::string(language).append(": ").append(fault));
     }
@@ -274,6 +299,11 @@ TEST_F(LanguagesTest, EmptyTextsAndIdentifiersAreFound) {
     EXPECT_THAT(faultsOf(entry("IDS_A", "") + rest), ElementsAre("xx: IDS_A is empty"));
     EXPECT_THAT(faultsOf(entry("IDS_A", "IDS_A") + rest),
                 ElementsAre("xx: IDS_A is an identifier"));
+}
+
+TEST_F(LanguagesTest, TextsThatWereNotTranslatedAreFound) {
+    EXPECT_THAT(faultsOf(entry("IDS_A", "A") + "\n# Says it." + entry("IDS_N", "%d %s")),
+                ElementsAre("xx: IDS_A is English"));
 }
 
 TEST_F(LanguagesTest, OtherConversionsAreFound) {
