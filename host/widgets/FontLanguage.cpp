@@ -7,6 +7,7 @@
 #include <vector>
 
 #include <dlfcn.h>
+#include <unistd.h>
 
 #include <Ecore_Evas.h>
 #include <Elementary.h>
@@ -14,6 +15,9 @@
 
 #include "EvasLists.h"
 #include "device/export.h"
+
+#define LOG_TAG "device-host"
+#include "base/Log.h"
 
 // The toolkit takes the language of a text from the C library's locale, which is often C alone.
 // These functions come before its own and add the language of the device.
@@ -121,7 +125,13 @@ void drawWindowsAnew() {
 namespace host {
 
 void chooseFonts(const std::string& folder) {
-    setenv("FONTCONFIG_FILE", (folder + "/fonts.conf").c_str(), 0);
+    const std::string file = folder + "/fonts.conf";
+    // With a file that is missing there would be no fonts at all.
+    if (access(file.c_str(), R_OK) == 0)
+        setenv("FONTCONFIG_FILE", file.c_str(), 0);
+    else
+        LOG_WARNING("%s is missing, characters may have the forms of another language",
+                    file.c_str());
 }
 
 void setFontLanguage(const std::string& locale) {

@@ -167,6 +167,20 @@ TEST_F(LiveDeviceLanguageTest, ApplicationsAreToldWhenAllIsDone) {
     EXPECT_EQ(told, "إلغاء from the right;Abbrechen from the left;");
 }
 
+TEST_F(LiveDeviceLanguageTest, TheLocaleStaysTheEnvironments) {
+    const char* const all = std::getenv("LC_ALL");
+    const std::string before = all ? all : "";
+    unsetenv("LC_ALL");
+    setenv("LANG", "C.UTF-8", 1);
+    setenv("LC_NUMERIC", "C", 1);
+    choose("de");
+    EXPECT_STREQ(setlocale(LC_NUMERIC, nullptr), "C");
+    EXPECT_STREQ(setlocale(LC_MESSAGES, nullptr), "C.UTF-8");
+    unsetenv("LC_NUMERIC");
+    if (all)
+        setenv("LC_ALL", before.c_str(), 1);
+}
+
 TEST_F(LiveDeviceLanguageTest, AChangeEndsTheLanguageOfOneRun) {
     device_host_shutdown();
     setenv("CLOCK_LANGUAGE", "es", 1);
