@@ -32,7 +32,7 @@ void PrintTo(const Look& look, std::ostream* out) {
 }
 
 const std::vector<Look> LOOKS = {
-    {"ja", SHARED, JAPANESE},   {"zh_CN", SHARED, CHINESE},       {"ko", HANGUL, CHINESE},
+    {"ja", SHARED, JAPANESE},   {"zh_CN", SHARED, CHINESE},     {"ko", HANGUL, CHINESE},
     {"ja", "アラー", JAPANESE}, {"zh_CN", "闹钟设置", CHINESE},
 };
 

@@ -82,8 +82,9 @@ private:
 };
 
 TEST_F(RegionSwitchTest, AnOpenEditorLooksAsIfItHadBeenOpenedSo) {
-    const std::vector<Form> forms = {{"en_US", TWELVE}, {"ko_KR", TWELVE},      {"de_DE", TWENTY_FOUR},
-                                     {"hi_IN", TWELVE}, {"ar_EG", TWENTY_FOUR}, {"ja_JP", TWELVE}};
+    const std::vector<Form> forms = {{"en_US", TWELVE},      {"ko_KR", TWELVE},
+                                     {"de_DE", TWENTY_FOUR}, {"hi_IN", TWELVE},
+                                     {"ar_EG", TWENTY_FOUR}, {"ja_JP", TWELVE}};
     for (const Form& wanted : forms) {
         for (const Form& before : forms) {
             choose(wanted);

@@ -33,7 +33,8 @@ protected:
     Evas_Object* writeBlock(const std::string& style, const char* text, int width, int height) {
         Evas_Object* object = evas_object_textblock_add(stage().canvas());
         _styles.push_back(evas_textblock_style_new());
-        evas_textblock_style_set(_styles.back(), ("DEFAULT='font=Roboto color=#FFFFFF " + style + "'").c_str());
+        evas_textblock_style_set(_styles.back(),
+                                 ("DEFAULT='font=Roboto color=#FFFFFF " + style + "'").c_str());
         evas_object_textblock_style_set(object, _styles.back());
         evas_object_resize(object, width, height);
         evas_object_textblock_text_markup_set(object, text);

@@ -169,8 +169,7 @@ TextInk inkOf(const FoundText& found) {
     const InkArea room = roomOf(found.object);
     const InkArea place = areaOf(found.object);
     for (const Spot& pixel : pixelsOf(found.object)) {
-        const InkArea drawn =
-            drawnArea(found.object, {place.x + pixel.x, place.y + pixel.y, 1, 1});
+        const InkArea drawn = drawnArea(found.object, {place.x + pixel.x, place.y + pixel.y, 1, 1});
         const double x = drawn.x + drawn.width / 2;
         const double y = drawn.y + drawn.height / 2;
         if (!holds(room, x, y))
