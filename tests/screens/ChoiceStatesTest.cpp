@@ -90,7 +90,7 @@ TEST_F(ToneStatesTest, TheToneThatIsChosenIsMarked) {
     EXPECT_EQ(mark(lastList(), 0).unlike(none), 0);
 }
 
-TEST_F(ToneStatesTest, DoneIsPalerUntilATonehasBeenChosen) {
+TEST_F(ToneStatesTest, DoneIsPalerUntilAToneHasBeenChosen) {
     Evas_Object* const done = stage().findText("Done")->widget;
     const Look before(stage(), done);
     stage().screenshot("tone-done-disabled");

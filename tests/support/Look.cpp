@@ -21,6 +21,10 @@ int channel(unsigned pixel, int shift) {
     return static_cast<int>(pixel >> static_cast<unsigned>(shift) & 0xFF);
 }
 
+int brightness(unsigned pixel) {
+    return std::max({channel(pixel, RED), channel(pixel, GREEN), channel(pixel, BLUE)});
+}
+
 bool differ(unsigned one, unsigned other) {
     return std::ranges::any_of(std::initializer_list<int>{RED, GREEN, BLUE}, [&](int shift) {
         return std::abs(channel(one, shift) - channel(other, shift)) >= CLEARLY;
@@ -50,8 +54,15 @@ int Look::accent() const {
 int Look::brightest() const {
     int most = 0;
     for (const unsigned pixel : _pixels)
-        most = std::max({most, channel(pixel, RED), channel(pixel, GREEN), channel(pixel, BLUE)});
+        most = std::max(most, brightness(pixel));
     return most;
+}
+
+int Look::darkest() const {
+    int least = 255;
+    for (const unsigned pixel : _pixels)
+        least = std::min(least, brightness(pixel));
+    return least;
 }
 
 void pressOn(Stage& stage, Evas_Object* object) {

@@ -21,6 +21,8 @@ public:
     int accent() const;
     /** The brightest channel of any pixel, 0 to 255. */
     int brightest() const;
+    /** The same of the darkest pixel. */
+    int darkest() const;
 
 private:
     std::vector<unsigned> _pixels;
