@@ -3,6 +3,7 @@
 #include <ctime>
 #include <string>
 
+#include "CalendarDays.h"
 #include "Index.h"
 #include "ThemeNames.h"
 
@@ -10,7 +11,6 @@ namespace host {
 
 namespace {
 
-constexpr int DAYS_OF_WEEK = 7;
 constexpr int DAYS_DRAWN = 42;
 
 void emit(const FocusThing& thing, const char* signal, const char* source) {
@@ -27,16 +27,12 @@ Evas_Object* groundOf(const FocusThing& thing) {
     return around && !thing.list ? around : nullptr;
 }
 
-/** Where the calendar draws its selected day; the toolkit counts its days from 0. */
+/** Where the calendar draws its selected day. */
 int placeOfSelectedDay(const Evas_Object* calendar) {
     std::tm day{};
     elm_calendar_selected_time_get(calendar, &day);
-    const int mday = day.tm_mday;
-    day.tm_mday = 1;
-    day.tm_hour = 12;
-    timegm(&day);
-    const int first = static_cast<int>(elm_calendar_first_day_of_week_get(calendar));
-    return (day.tm_wday - first + DAYS_OF_WEEK) % DAYS_OF_WEEK + mday - 1;
+    return cellOfDay(day, day.tm_mday,
+                     static_cast<int>(elm_calendar_first_day_of_week_get(calendar)));
 }
 
 void ringDay(Evas_Object* calendar) {
