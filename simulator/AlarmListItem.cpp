@@ -126,7 +126,6 @@ Evas_Object* AlarmListItem::createSwitch(Evas_Object* genlist) {
     elm_object_style_set(check, "on&off");
     elm_check_state_set(check, isOn() ? EINA_TRUE : EINA_FALSE);
     // A touch of the switch is none of the row.
-    evas_object_repeat_events_set(check, EINA_FALSE);
     evas_object_propagate_events_set(check, EINA_FALSE);
     evas_object_smart_callback_add(check, "changed", _switchedCb, this);
     _switches.add(check);

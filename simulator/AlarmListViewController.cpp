@@ -76,8 +76,7 @@ void AlarmListViewController::pushPage(app_assist::WContentViewController* page)
 }
 
 void AlarmListViewController::switchAlarm(int id, bool on) {
-    if (isOnTop())
-        switchStoredAlarm(id, on);
+    switchStoredAlarm(id, on);
     // What could not be stored is announced by nobody, but the switch has moved.
     scheduleRefresh();
 }

@@ -105,6 +105,17 @@ TEST_F(AlarmListPageTest, aTapOnAnAlarmOpensTheEditorOnIt) {
     EXPECT_TRUE(stage().shows("Edit")) << readFace();
 }
 
+TEST_F(AlarmListPageTest, theAlarmThatTheEditorWasOpenedOnStandsInTheMiddleThen) {
+    for (int hour = 10; hour < 20; ++hour)
+        store(hour, 0, hour % 2 == 0 ? "Several words that take two lines" : "");
+    openPage();
+    page->editAlarm(alarms().at(5).id);
+    stage().settle();
+    stage().tapText("Cancel");
+    stage().settle();
+    EXPECT_NEAR(Stage::area(switchOf("15:00")).middle().y, 180, 10) << readFace();
+}
+
 TEST_F(AlarmListPageTest, aSecondRequestWhileTheEditorIsOpenDoesNothing) {
     openPage();
     page->createAlarm();
