@@ -18,21 +18,24 @@
 namespace simulator {
 namespace {
 
-/** A line's own direction, and within it text of the other one. */
-constexpr const char* LEFT_TO_RIGHT_LINE = "\u200e\u202b";
-constexpr const char* RIGHT_TO_LEFT_LINE = "\u200f\u202a";
-constexpr const char* LINE_END = "\u202c";
+constexpr UChar32 LEFT_TO_RIGHT_MARK = 0x200e;
+constexpr UChar32 RIGHT_TO_LEFT_MARK = 0x200f;
+constexpr UChar32 LEFT_TO_RIGHT_TEXT = 0x202a;
+constexpr UChar32 RIGHT_TO_LEFT_TEXT = 0x202b;
+constexpr UChar32 END_OF_TEXT = 0x202c;
 
 /** A line begins where the row does, also when its own letters run the other way. */
 std::string lineMarkup(const std::string& text) {
     const auto letters = icu::UnicodeString::fromUTF8(text);
     const auto direction = ubidi_getBaseDirection(letters.getBuffer(), letters.length());
     const bool mirrored = elm_config_mirrored_get() != EINA_FALSE;
-    if (mirrored && direction == UBIDI_LTR)
-        return RIGHT_TO_LEFT_LINE + markupOf(text) + LINE_END;
-    if (!mirrored && direction == UBIDI_RTL)
-        return LEFT_TO_RIGHT_LINE + markupOf(text) + LINE_END;
-    return markupOf(text);
+    if (direction != (mirrored ? UBIDI_LTR : UBIDI_RTL))
+        return markupOf(text);
+    icu::UnicodeString line(mirrored ? RIGHT_TO_LEFT_MARK : LEFT_TO_RIGHT_MARK);
+    line.append(mirrored ? LEFT_TO_RIGHT_TEXT : RIGHT_TO_LEFT_TEXT);
+    line.append(letters).append(END_OF_TEXT);
+    std::string utf8;
+    return markupOf(line.toUTF8String(utf8));
 }
 
 /** Moves the knob there; nobody is told that it has changed. */
@@ -106,7 +109,7 @@ std::string AlarmListItem::textOf(const std::string& part) const {
 std::string AlarmListItem::aboutMarkup() const {
     const bool on = isOn();
     const std::string days = lineMarkup(alarmDaysText(_alarm, std::time(nullptr)));
-    const std::string about = on ? days : tagged("off", days);
+    std::string about = on ? days : tagged("off", days);
     if (_alarm.name.empty())
         return about;
     return tagged(on ? "label" : "label_off", lineMarkup(_alarm.name)) + "<br>" + about;
