@@ -1,5 +1,7 @@
 // Another language is chosen while a screen is open: it then looks as if it had been opened so.
 
+#include <algorithm>
+#include <cmath>
 #include <functional>
 #include <memory>
 #include <optional>
@@ -19,6 +21,7 @@
 #include "screens/CityPickerFixture.h"
 #include "screens/DatePopupFixture.h"
 #include "screens/EditorFixture.h"
+#include "support/FaceInk.h"
 #include "support/LiveLanguage.h"
 
 using testing::ElementsAreArray;
@@ -44,7 +47,7 @@ std::string nameOf(const testing::TestParamInfo<Change>& change) {
     return std::string(change.param.from) + "_" + change.param.to;
 }
 
-/** Every visible text with its place. */
+/** Every visible text and picture with its place. */
 std::vector<std::string> look(const Stage& stage) {
     std::vector<std::string> lines;
     for (const FoundText& found : stage.texts()) {
@@ -53,6 +56,14 @@ std::vector<std::string> look(const Stage& stage) {
                         std::to_string(area.y) + " " + std::to_string(area.width) + "x" +
                         std::to_string(area.height));
     }
+    for (const Ink& ink : inkOf(stage.canvas()))
+        // The toolkit leaves the handles of a selection anywhere.
+        if (!ink.isText && ink.what.find("elementary/themes") == std::string::npos)
+            lines.push_back(ink.what + " at " + std::to_string(std::lround(ink.area.x)) + "," +
+                            std::to_string(std::lround(ink.area.y)) + " " +
+                            std::to_string(std::lround(ink.area.width)));
+    // Rows that were built anew are drawn in another order.
+    std::ranges::sort(lines);
     return lines;
 }
 

@@ -5,6 +5,8 @@
 #include <utility>
 
 #include <Evas.h>
+#include <unicode/uchar.h>
+#include <unicode/unistr.h>
 
 #include "support/TextInk.h"
 
@@ -26,6 +28,15 @@ int fullWidth(const FoundText& found) {
     evas_object_geometry_get(copy, nullptr, nullptr, &width, nullptr);
     evas_object_del(copy);
     return width;
+}
+
+/** One screen must not mix two forms of digits. */
+bool hasOtherDigits(const std::string& text) {
+    const auto unicode = icu::UnicodeString::fromUTF8(text);
+    for (int32_t at = 0; at < unicode.length(); at = unicode.moveIndex32(at, 1))
+        if (u_isdigit(unicode.char32At(at)) && unicode.char32At(at) > u'9')
+            return true;
+    return false;
 }
 
 /** How much of a line its clips leave, before a row near the rim is drawn smaller as a whole. */
@@ -65,6 +76,8 @@ std::vector<std::string> faultsOf(const std::vector<FoundText>& texts) {
     for (const FoundText& found : texts) {
         if (found.text.find("IDS_") != std::string::npos)
             faults.push_back(found.text + " has no translation");
+        else if (hasOtherDigits(found.text))
+            faults.push_back(found.text + " has other digits");
         else if (isCut(found))
             faults.push_back(found.text + " is cut");
         else if (isTooLow(found))

@@ -203,6 +203,7 @@ std::string withoutDots(std::string style) {
 
 std::vector<TextInk> textInkOf(const std::vector<FoundText>& texts) {
     std::vector<TextInk> inks;
+    inks.reserve(texts.size());
     for (const FoundText& found : texts)
         inks.push_back(inkOf(found));
     return inks;
