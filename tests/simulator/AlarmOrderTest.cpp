@@ -2,9 +2,7 @@
 
 #include "AlarmOrder.h"
 
-#include <cstdlib>
-#include <ctime>
-#include <string>
+#include <algorithm>
 #include <vector>
 
 #include <gmock/gmock.h>
@@ -84,9 +82,9 @@ const std::vector<Row> ROWS{
 };
 
 std::vector<int> idsOf(const std::vector<ClockAlarmDbData>& alarms) {
-    std::vector<int> ids;
-    for (const ClockAlarmDbData& alarm : alarms)
-        ids.push_back(alarm.id);
+    std::vector<int> ids(alarms.size());
+    std::transform(alarms.begin(), alarms.end(), ids.begin(),
+                   [](const ClockAlarmDbData& alarm) { return alarm.id; });
     return ids;
 }
 
