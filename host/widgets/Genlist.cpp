@@ -288,14 +288,18 @@ void watchRest(Evas_Object* list) {
 }
 
 /** Rows end softly below what stands above a list, once there are some there. */
-void listScrolled(void*, Evas_Object* list, void*) {
-    listMoves(list);
+void soften(const Evas_Object* list) {
     int y = 0;
     elm_scroller_region_get(list, nullptr, &y, nullptr, nullptr);
     Edje_Message_Float message = {std::clamp(y / FADE_WAY, 0.0, 1.0)};
     Evas_Object* edje = elm_layout_edje_get(list);
     edje_object_message_send(edje, EDJE_MESSAGE_FLOAT, host::theme::MESSAGE_FADE, &message);
     edje_object_message_signal_process(edje);
+}
+
+void listScrolled(void*, Evas_Object* list, void*) {
+    listMoves(list);
+    soften(list);
 }
 
 /** What changed in a row behind a popup or another page would stay as it was drawn before. */
@@ -316,6 +320,8 @@ void drawAnew(const Evas_Object* list) {
 void rowRealized(void*, Evas_Object* list, void*) {
     eachRow(list, adopt);
     drawAnew(list);
+    // A list that was turned round has forgotten how soft it was.
+    soften(list);
     listMoves(list);
 }
 

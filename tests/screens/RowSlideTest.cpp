@@ -1,5 +1,8 @@
 // A row that has no room for its words shows them to the end while it rests in the middle.
 
+#include <algorithm>
+#include <cstdint>
+#include <cstdlib>
 #include <cstring>
 #include <string>
 #include <vector>
@@ -84,6 +87,19 @@ TEST_P(RowSlideTest, LongWordsAreReadToTheirEndAndStandAgain) {
     const int frames = stage().renderedFrames();
     Stage::advance(20);
     EXPECT_EQ(stage().renderedFrames(), frames) << "it moves by itself";
+}
+
+TEST_P(RowSlideTest, AListThatHasNeverMovedShowsItToo) {
+    show();
+    const auto widest = [this] {
+        int width = 0;
+        for (const FoundText& found : stage().texts())
+            width = std::max(width, Stage::area(found.object).width);
+        return width;
+    };
+    const int rest = widest();
+    Stage::advance(2.5);
+    EXPECT_GT(widest(), rest);
 }
 
 TEST_P(RowSlideTest, ScrollingEndsIt) {
