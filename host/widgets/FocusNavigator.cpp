@@ -288,53 +288,72 @@ bool FocusNavigator::handle(FocusInput input) {
 }
 
 bool FocusNavigator::act(const FocusView& view, const FocusResponse& response, FocusInput input) {
-    const auto thing = found(view);
-    const bool byKeyboard = !isBezel(input);
     switch (response.action) {
     case FocusAction::PassOn:
         return false;
     case FocusAction::First:
-        focus(view.first(), byKeyboard);
-        return true;
     case FocusAction::Last:
-        focus(view.last(), byKeyboard);
-        return true;
     case FocusAction::Nearest:
-        focus(view.nearest(), byKeyboard);
-        return true;
     case FocusAction::Next:
-    case FocusAction::Previous: {
-        const auto next = view.beside(*thing, response.action == FocusAction::Next ? 1 : -1);
-        // At an end it stays, but shows where it is.
-        focus(next ? next : thing, byKeyboard);
+    case FocusAction::Previous:
+        focus(destination(view, response.action), !isBezel(input));
+        return true;
+    default:
+        lead(true);
+        use(*found(view), response);
         return true;
     }
+}
+
+/** Where a move leads. */
+std::optional<FocusThing> FocusNavigator::destination(const FocusView& view,
+                                                      FocusAction move) const {
+    switch (move) {
+    case FocusAction::First:
+        return view.first();
+    case FocusAction::Last:
+        return view.last();
+    case FocusAction::Next:
+        return besideOrSame(view, 1);
+    case FocusAction::Previous:
+        return besideOrSame(view, -1);
+    default:
+        return view.nearest();
+    }
+}
+
+/** At an end the focus stays, but shows where it is. */
+std::optional<FocusThing> FocusNavigator::besideOrSame(const FocusView& view, int direction) const {
+    const auto thing = found(view);
+    const auto next = view.beside(*thing, direction);
+    return next ? next : thing;
+}
+
+/** Whatever is pressed may close the window: nothing comes after it. */
+void FocusNavigator::use(const FocusThing& thing, const FocusResponse& response) {
+    switch (response.action) {
     case FocusAction::Activate:
-        lead(true);
-        activate(*thing);
-        return true;
+        activate(thing);
+        return;
     case FocusAction::Hold:
-        lead(true);
-        hold(*thing);
-        return true;
-    case FocusAction::StartTurning:
-    case FocusAction::StopTurning:
-        lead(true);
-        startTurning(response.action == FocusAction::StartTurning);
-        return true;
+        hold(thing);
+        return;
     case FocusAction::StartTyping:
-        lead(true);
-        giveToolkitFocus(*thing);
-        return true;
+        giveToolkitFocus(thing);
+        return;
     case FocusAction::Turn:
-        lead(true);
-        bringToMiddle(*thing);
-        turn(*thing, response.turn);
-        if (const auto still = enterPage() ? found(FocusView(_root)) : std::nullopt)
-            showRing(*still, _turning);
-        return true;
+        turnInSight(thing, response.turn);
+        return;
+    default:
+        startTurning(response.action == FocusAction::StartTurning);
     }
-    return false;
+}
+
+void FocusNavigator::turnInSight(const FocusThing& thing, int steps) {
+    bringToMiddle(thing);
+    turn(thing, steps);
+    if (const auto still = enterPage() ? found(FocusView(_root)) : std::nullopt)
+        showRing(*still, _turning);
 }
 
 void FocusNavigator::focus(const std::optional<FocusThing>& thing, bool byKeyboard) {

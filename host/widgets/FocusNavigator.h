@@ -57,6 +57,10 @@ private:
     /** @return False when the toolkit may have the input. */
     bool handle(FocusInput input);
     bool act(const FocusView& view, const FocusResponse& response, FocusInput input);
+    std::optional<FocusThing> destination(const FocusView& view, FocusAction move) const;
+    std::optional<FocusThing> besideOrSame(const FocusView& view, int direction) const;
+    void use(const FocusThing& thing, const FocusResponse& response);
+    void turnInSight(const FocusThing& thing, int steps);
     /** Finds the page that the input is for, and where its focus was. */
     bool enterPage();
     std::optional<FocusThing> found(const FocusView& view) const;
