@@ -66,11 +66,6 @@ Ecore_Event_Handler*& keyHandler() {
     return handler;
 }
 
-Eina_Bool thawCb(void*, Evas* canvas) {
-    evas_event_thaw(canvas);
-    return EINA_TRUE;
-}
-
 /** What lies below must not answer as well. */
 template <typename Event>
 void keepFromBelow(Event& event) {
@@ -146,8 +141,9 @@ void FocusNavigator::_windowResizedCb(void* data, Evas*, Evas_Object* window, vo
     evas_object_resize(static_cast<FocusNavigator*>(data)->_catcher, width, height);
 }
 
-void FocusNavigator::_rootDeletedCb(void* data, Evas*, Evas_Object* root, void*) {
+void FocusNavigator::_rootDeletedCb(void* data, const Efl_Event* event) {
     auto* self = static_cast<FocusNavigator*>(data);
+    Evas_Object* root = event->object;
     // A page may go after the window.
     if (std::find(navigators().begin(), navigators().end(), self) == navigators().end())
         return;
@@ -182,10 +178,6 @@ void FocusNavigator::_mouseDownCb(void* data, Evas*, Evas_Object*, void* info) {
     auto& event = *static_cast<Evas_Event_Mouse_Down*>(info);
     if (event.button == MIDDLE_BUTTON) {
         keepFromBelow(event);
-        // A slider would go where the pointer is, whichever button it was.
-        Evas* canvas = evas_object_evas_get(self->_catcher);
-        evas_event_freeze(canvas);
-        evas_post_event_callback_push(canvas, thawCb, nullptr);
         if (!self->startPress())
             self->handle(FocusInput::Press);
     } else {
@@ -251,7 +243,8 @@ bool FocusNavigator::enterPage() {
     }
     if (root && !_memories.contains(root)) {
         _memories[root];
-        evas_object_event_callback_add(root, EVAS_CALLBACK_DEL, _rootDeletedCb, this);
+        // The canvas says nothing of a page that goes while it takes no input.
+        efl_event_callback_add(root, EFL_EVENT_DEL, _rootDeletedCb, this);
     }
     return root != nullptr;
 }

@@ -8,6 +8,7 @@
 #include <optional>
 
 #include <Ecore.h>
+#include <Eo.h>
 #include <Evas.h>
 
 #include "FocusRules.h"
@@ -48,7 +49,7 @@ private:
     static Eina_Bool _heldCb(void* data);
     static void _windowDeletedCb(void* data, Evas*, Evas_Object*, void*);
     static void _windowResizedCb(void* data, Evas*, Evas_Object* window, void*);
-    static void _rootDeletedCb(void* data, Evas*, Evas_Object* root, void*);
+    static void _rootDeletedCb(void* data, const Efl_Event* event);
     static void _wheelCb(void* data, Evas*, Evas_Object*, void* info);
     static void _mouseDownCb(void* data, Evas*, Evas_Object*, void* info);
     static void _mouseUpCb(void* data, Evas*, Evas_Object*, void* info);

@@ -69,6 +69,8 @@ inline constexpr int MESSAGE_FADE = 1;
 /** Where a finger takes hold of an index, and what it says in the middle. */
 inline constexpr const char* PART_INDEX_TOUCH = "elm.swallow.event.0";
 inline constexpr const char* PART_INDEX_SAID = "elm.text";
+/** Where a slider is touched. */
+inline constexpr const char* PART_SLIDER_BAR = "elm.swallow.bar";
 /** The days of a calendar. */
 inline constexpr const char* PART_CALENDAR_WEEKS = "weeks";
 
