@@ -1,3 +1,8 @@
+// The toolkit still calls its interface for screen readers a beta.
+#define EFL_BETA_API_SUPPORT
+#define EFL_ACCESS_OBJECT_PROTECTED
+#include <Elementary.h>
+
 #include "support/Ring.h"
 
 #include <algorithm>
@@ -35,17 +40,25 @@ bool isOn(const Evas_Object* edje, const char* part, std::string_view state) {
            evas_object_visible_get(edje_object_part_object_get(edje, part));
 }
 
-/** A calendar rings one of its days; an index says in the middle where it is. */
-bool isRinged(const Evas_Object* edje) {
+Evas_Object* partObject(const Evas_Object* edje, const char* part) {
+    // The toolkit hands it out for looking only.
+    return const_cast<Evas_Object*>(edje_object_part_object_get(edje, part));
+}
+
+/** What draws the ring; a calendar rings one of its days, an index says in the middle where it is.
+ */
+Evas_Object* ringOf(const Evas_Object* edje) {
     if (isOn(edje, "focus", "focused") || isOn(edje, "focus", "turning")) {
-        return !edje_object_part_exists(edje, "said") || isOn(edje, "said", "active");
+        const bool isSeen = !edje_object_part_exists(edje, "said") || isOn(edje, "said", "active");
+        return isSeen ? partObject(edje, "focus") : nullptr;
     }
     for (int day = 0; day < 42 && edje_object_part_exists(edje, "cit_0_focus"); ++day) {
-        if (isOn(edje, ("cit_" + std::to_string(day) + "_focus").c_str(), "focused")) {
-            return true;
+        const std::string part = "cit_" + std::to_string(day) + "_focus";
+        if (isOn(edje, part.c_str(), "focused")) {
+            return partObject(edje, part.c_str());
         }
     }
-    return false;
+    return nullptr;
 }
 
 std::string textOf(const Stage& stage, Evas_Object* edje) {
@@ -59,11 +72,22 @@ std::string textOf(const Stage& stage, Evas_Object* edje) {
     return {};
 }
 
-std::string typeOf(Evas_Object* object) {
+Evas_Object* widgetOf(Evas_Object* object) {
     while (object != nullptr && !elm_object_widget_check(object)) {
         object = evas_object_smart_parent_get(object);
     }
-    return object == nullptr ? "" : elm_object_widget_type_get(object);
+    return object;
+}
+
+std::string nameOf(const Stage& stage, Evas_Object* edje, const std::string& type) {
+    const std::string text = textOf(stage, edje);
+    const char* const read = type == "Elm_Button" && text.empty()
+                                 ? efl_access_object_i18n_name_get(widgetOf(edje))
+                                 : nullptr;
+    if (read != nullptr && *read != '\0') {
+        return read;
+    }
+    return text.empty() ? type : text;
 }
 
 } // namespace
@@ -76,13 +100,14 @@ std::vector<Ringed> ringed(const Stage& stage) {
             continue;
         }
         walk(object, [&](Evas_Object* inner) {
-            if (std::string_view(evas_object_type_get(inner)) != "edje" || !isRinged(inner) ||
-                !stage.canBeSeen(inner)) {
+            Evas_Object* const ring =
+                std::string_view(evas_object_type_get(inner)) == "edje" ? ringOf(inner) : nullptr;
+            if (ring == nullptr || !stage.canBeSeen(inner)) {
                 return;
             }
-            const std::string text = textOf(stage, inner);
-            const std::string type = typeOf(inner);
-            found.push_back({text.empty() ? type : text, type, inner, Stage::area(inner)});
+            Evas_Object* const widget = widgetOf(inner);
+            const std::string type = widget == nullptr ? "" : elm_object_widget_type_get(widget);
+            found.push_back({nameOf(stage, inner, type), type, inner, ring, Stage::area(inner)});
         });
     }
     return found;
@@ -91,7 +116,7 @@ std::vector<Ringed> ringed(const Stage& stage) {
 Ringed theRinged(const Stage& stage) {
     const auto found = ringed(stage);
     EXPECT_EQ(found.size(), 1U);
-    return found.empty() ? Ringed{"-", "", nullptr, {}} : found.front();
+    return found.empty() ? Ringed{"-", "", nullptr, nullptr, {}} : found.front();
 }
 
 std::string ringedName(const Stage& stage) {

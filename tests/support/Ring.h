@@ -11,9 +11,10 @@
 
 /** Something with a ring round it. */
 struct Ringed {
-    std::string name; ///< Its first text, else its widget's type.
+    std::string name; ///< Its first text, else what a button is called, else its widget's type.
     std::string type; ///< Of the closest widget.
     Evas_Object* edje = nullptr;
+    Evas_Object* ring = nullptr; ///< What draws the ring.
     Area area;
 };
 
