@@ -32,6 +32,8 @@ public:
 
     /** @brief A new item class of the style "edit.theme.time". */
     Elm_Genlist_Item_Class* getItemClassNew() override;
+    /** @brief Names the row for screen readers. */
+    void onSetElmObjectItem(Elm_Object_Item* item) override;
 
     /**
      * @brief Sets what the date button does. Replaces the earlier function.
@@ -72,6 +74,7 @@ private:
     Evas_Object* createCalendar(Evas_Object* genlist);
     Evas_Object* createDateButton(Evas_Object* calendar);
     void showDate(Evas_Object* calendar);
+    void nameRow();
     std::string ringDateText();
     std::string repairedDateText();
 

@@ -27,6 +27,8 @@ public:
 
     Elm_Genlist_Item_Class* getItemClassNew() override;
     void onSelect(Elm_Object_Item* item) override;
+    /** @brief Names the row for screen readers. */
+    void onSetElmObjectItem(Elm_Object_Item* item) override;
 
     /** @brief Sets what a tap does. Replaces the earlier function. */
     void setSelectedCb(const std::function<void()>& selected);
@@ -64,6 +66,8 @@ public:
 
 private:
     Evas_Object* createSlider(Evas_Object* genlist);
+    static void _languageChangedCb(void* data, Evas_Object* slider, void* info);
+    void nameSliders();
     void step(std::optional<std::int32_t> level);
     void _updatePlayerSound();
     void _updateVolumeIconAndPlayer();

@@ -7,6 +7,8 @@
 
 #include "VolumeView.h"
 #include "WatchFace.h"
+#include "app_assist/WAccessible.h"
+#include "clock/ClockText.h"
 #include "device/eext.h"
 #include "device/sound_manager.h"
 
@@ -18,6 +20,7 @@ namespace simulator {
 namespace {
 constexpr double REFRESH_SECONDS = 0.5;
 constexpr int LOUDEST = 15;
+constexpr const char* TITLE = "IDS_QP_HEADER_ALARM_VOLUME";
 } // namespace
 
 QuickPanel::QuickPanel(Evas_Object* window, const std::string& theme,
@@ -25,11 +28,11 @@ QuickPanel::QuickPanel(Evas_Object* window, const std::string& theme,
     : _layout(elm_layout_add(window)), _changed(std::move(changed)) {
     if (!elm_layout_file_set(_layout, theme.c_str(), "simulator/quickpanel"))
         LOG_ERROR("'%s' has no quick panel", theme.c_str());
-    elm_object_domain_translatable_part_text_set(_layout, "panel.title", nullptr,
-                                                 "IDS_QP_HEADER_ALARM_VOLUME");
+    elm_object_domain_translatable_part_text_set(_layout, "panel.title", nullptr, TITLE);
     elm_object_domain_translatable_part_text_set(_layout, "panel.hint", nullptr,
                                                  "IDS_QP_BODY_PRESS_THE_VOLUME_KEYS_TO_CHANGE_IT");
     elm_object_signal_callback_add(_layout, "panel,close", "simulator", _closeCb, this);
+    evas_object_smart_callback_add(_layout, "language,changed", _languageChangedCb, this);
     evas_object_resize(_layout, FACE_SIZE, FACE_SIZE);
     evas_object_layer_set(_layout, LAYER_SYSTEM);
     evas_object_show(_layout);
@@ -53,6 +56,7 @@ void QuickPanel::open() {
     eext_object_event_callback_add(_layout, EEXT_EVENT_BACK, _backCb, this);
     evas_object_event_callback_add(_layout, EVAS_CALLBACK_MOUSE_WHEEL, _bezelCb, this);
     elm_object_signal_emit(_layout, "panel,show", "simulator");
+    app_assist::announce(_layout, readText());
     _changed(true);
 }
 
@@ -61,14 +65,29 @@ void QuickPanel::close() {
     eext_object_event_callback_del(_layout, EEXT_EVENT_BACK, _backCb);
     evas_object_event_callback_del_full(_layout, EVAS_CALLBACK_MOUSE_WHEEL, _bezelCb, this);
     elm_object_signal_emit(_layout, "panel,hide", "simulator");
+    app_assist::endAnnouncement(_layout);
     _changed(false);
 }
 
 void QuickPanel::refresh() {
     int level = 0;
     sound_manager_get_volume(SOUND_TYPE_ALARM, &level);
-    if (std::exchange(_level, level) != level)
-        setVolumeLevel(_layout, level);
+    if (std::exchange(_level, level) == level)
+        return;
+    setVolumeLevel(_layout, level);
+    if (isShown())
+        app_assist::setAccessibleName(_layout, readText());
+}
+
+std::string QuickPanel::readText() const {
+    return std::string(clockText(TITLE)) + ", " + std::to_string(_level) + " / " +
+           std::to_string(LOUDEST);
+}
+
+void QuickPanel::_languageChangedCb(void* data, Evas_Object* layout, void*) {
+    const auto* self = static_cast<QuickPanel*>(data);
+    if (self->isShown())
+        app_assist::setAccessibleName(layout, self->readText());
 }
 
 Eina_Bool QuickPanel::_refreshCb(void* data) {

@@ -41,9 +41,12 @@ private:
     static Eina_Bool _refreshCb(void* data);
     static void _closeCb(void* data, Evas_Object* layout, const char* signal, const char* source);
     static void _bezelCb(void* data, Evas* canvas, Evas_Object* layout, void* info);
+    static void _languageChangedCb(void* data, Evas_Object* layout, void* info);
     static void _backCb(void* data, Evas_Object* layout, void* info);
     void open();
     void close();
+    /** What screen readers are told. */
+    std::string readText() const;
 
     Evas_Object* _layout;
     std::function<void(bool)> _changed;

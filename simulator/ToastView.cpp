@@ -70,10 +70,12 @@ Eina_Bool ToastView::_timeOverCb(void* data) {
     }
     // The main loop deletes the timer of a callback that cancels.
     static_cast<void>(self->_timer.release());
-    if (self->_waiting.empty())
+    if (self->_waiting.empty()) {
         elm_object_signal_emit(self->_layout, "toast,hide", "simulator");
-    else
+        app_assist::endAnnouncement(self->_layout);
+    } else {
         self->showNext();
+    }
     return ECORE_CALLBACK_CANCEL;
 }
 

@@ -3,6 +3,7 @@
 
 #include <Elementary.h>
 
+#include <app_assist/WAccessible.h>
 #include <device/eext.h>
 
 #include "NullData.h"
@@ -40,6 +41,7 @@ Evas_Object* AlarmDiscardPopupViewController::onCreateView(Evas_Object* parent, 
     elm_popup_align_set(popup, ELM_NOTIFY_ALIGN_FILL, 1.0);
     elm_object_domain_translatable_part_text_set(popup, "title,text", nullptr,
                                                  "IDS_CLD_HEADER_DISCARD_CHANGES_ABB");
+    app_assist::setAccessibleTextId(popup, "IDS_CLD_HEADER_DISCARD_CHANGES_ABB");
     elm_object_domain_translatable_part_text_set(popup, nullptr, nullptr,
                                                  "IDS_CLD_POP_ALL_CHANGES_WILL_BE_DISCARDED");
     evas_object_size_hint_weight_set(popup, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);

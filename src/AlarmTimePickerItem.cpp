@@ -1,6 +1,8 @@
 #define LOG_TAG "alarm-ui-common"
 #include "AlarmTimePickerItem.h"
 
+#include <array>
+#include <cstdio>
 #include <cstdlib>
 #include <memory>
 #include <string_view>
@@ -8,6 +10,7 @@
 
 #include <Elementary.h>
 
+#include <app_assist/WAccessible.h>
 #include <base/Text.h>
 #include <clock/ClockStringUtil.h>
 #include <clock/ClockText.h>
@@ -206,6 +209,17 @@ std::string AlarmTimePickerItem::repairedDateText() {
     return rules::dateLineText(rules::DateLine::TomorrowAndDate, midnight);
 }
 
+void AlarmTimePickerItem::onSetElmObjectItem(Elm_Object_Item* /*item*/) {
+    nameRow();
+}
+
+/** The row itself has no text that a screen reader could read. */
+void AlarmTimePickerItem::nameRow() {
+    std::array<char, 32> time{};
+    std::snprintf(time.data(), time.size(), "%02d:%02d", _alarm.hour, _alarm.min);
+    app_assist::setAccessibleName(getElmObjectItem(), time.data());
+}
+
 void AlarmTimePickerItem::_datetimeChangedCb(void* data, Evas_Object* datetime, void*) {
     RETURN_IF_NULL(data);
     auto* self = static_cast<AlarmTimePickerItem*>(data);
@@ -215,6 +229,7 @@ void AlarmTimePickerItem::_datetimeChangedCb(void* data, Evas_Object* datetime, 
     if (datetime && elm_datetime_value_get(datetime, &picked)) {
         alarm.hour = picked.tm_hour;
         alarm.min = picked.tm_min;
+        self->nameRow();
     }
     if (alarm.repeatWeekly != 0 || alarm.manualDate != 0)
         return;

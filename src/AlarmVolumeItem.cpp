@@ -14,6 +14,12 @@
 #include "ThemePath.h"
 #include "rules/VolumeLevel.h"
 
+namespace {
+
+constexpr const char* TITLE = "IDS_QP_HEADER_ALARM_VOLUME";
+
+} // namespace
+
 AlarmVolumeItem::AlarmVolumeItem(ClockAlarmDbData& alarm) : _alarm(alarm) {}
 
 AlarmVolumeItem::~AlarmVolumeItem() {
@@ -21,6 +27,7 @@ AlarmVolumeItem::~AlarmVolumeItem() {
     for (Evas_Object* slider : _sliders.all()) {
         evas_object_smart_callback_del_full(slider, "changed", _volumeSliderChangeCb, this);
         evas_object_smart_callback_del_full(slider, "slider,drag,stop", _volumeSliderStopCb, this);
+        evas_object_smart_callback_del_full(slider, "language,changed", _languageChangedCb, this);
         while (evas_object_smart_callback_del_full(slider, "unfocused", _volumeSliderUnfocusedCb,
                                                    this)) {
         }
@@ -40,6 +47,11 @@ Elm_Genlist_Item_Class* AlarmVolumeItem::getItemClassNew() {
 void AlarmVolumeItem::onSelect(Elm_Object_Item*) {
     if (_selected)
         _selected();
+}
+
+/** The row itself has no text that a screen reader could read while it is out of sight. */
+void AlarmVolumeItem::onSetElmObjectItem(Elm_Object_Item* item) {
+    app_assist::setAccessibleTextId(item, TITLE);
 }
 
 void AlarmVolumeItem::setSelectedCb(const std::function<void()>& selected) {
@@ -114,6 +126,7 @@ Evas_Object* AlarmVolumeItem::createSlider(Evas_Object* genlist) {
     _updateVolumeIcon(genlist);
     evas_object_smart_callback_add(slider, "changed", _volumeSliderChangeCb, this);
     evas_object_smart_callback_add(slider, "slider,drag,stop", _volumeSliderStopCb, this);
+    evas_object_smart_callback_add(slider, "language,changed", _languageChangedCb, this);
     return slider;
 }
 
@@ -144,17 +157,26 @@ void AlarmVolumeItem::_volumeSliderUnfocusedCb(void* data, Evas_Object* slider, 
 void AlarmVolumeItem::_updateVolumeIcon(Evas_Object* parent) {
     const std::string path = themePath("edje/AlarmEditViewController.edj");
     const char* group = rules::volumeIconGroup(_alarm.volume, _alarm.type);
-    const std::string name = std::string(clockText("IDS_QP_HEADER_ALARM_VOLUME")) + ", " +
-                             std::to_string(_alarm.volume) + " / " +
-                             std::to_string(static_cast<int>(rules::LOUDEST_LEVEL));
+    nameSliders();
     for (Evas_Object* slider : _sliders.all()) {
-        app_assist::setAccessibleName(slider, name);
         Evas_Object* icon = elm_image_add(parent ? parent : slider);
         if (!path.empty())
             elm_image_file_set(icon, path.c_str(), group);
         evas_object_size_hint_aspect_set(icon, EVAS_ASPECT_CONTROL_VERTICAL, 1, 1);
         elm_object_part_content_set(slider, "elm.swallow.icon", icon);
     }
+}
+
+void AlarmVolumeItem::nameSliders() {
+    const std::string name = std::string(clockText(TITLE)) + ", " + std::to_string(_alarm.volume) +
+                             " / " + std::to_string(static_cast<int>(rules::LOUDEST_LEVEL));
+    for (Evas_Object* slider : _sliders.all())
+        app_assist::setAccessibleName(slider, name);
+}
+
+void AlarmVolumeItem::_languageChangedCb(void* data, Evas_Object*, void*) {
+    RETURN_IF_NULL(data);
+    static_cast<AlarmVolumeItem*>(data)->nameSliders();
 }
 
 void AlarmVolumeItem::_updatePlayerSound() {

@@ -163,6 +163,8 @@ void WorldClockAddCityViewController::_createIndex(Evas_Object* parent) {
     evas_object_size_hint_align_set(_index, EVAS_HINT_FILL, EVAS_HINT_FILL);
     elm_object_part_content_set(parent, "elm.swallow.fastscroll", _index);
     elm_index_autohide_disabled_set(_index, EINA_TRUE);
+    // Its letters are hours from Greenwich.
+    app_assist::setAccessibleName(_index, "GMT");
     evas_object_smart_callback_add(_index, "selected", _indexSelectedCb, this);
     evas_object_smart_callback_add(_index, "delay,changed", _indexChangedCb, this);
     evas_object_smart_callback_add(_index, "changed", _indexChangedCb, this);

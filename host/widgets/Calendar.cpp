@@ -1,3 +1,5 @@
+#include <ctime>
+
 #include <dlfcn.h>
 
 #include <Elementary.h>
@@ -10,8 +12,19 @@
 #define LOG_TAG "device-host"
 #include "base/Log.h"
 
-// The arrows of the toolkit's calendar have no names, and its words are the C library's. This
-// function comes before the toolkit's own.
+// The arrows of the toolkit's calendar have no names, nor has its day, and its words are the C
+// library's. These functions come before the toolkit's own.
+
+namespace {
+
+/** Screen readers are told the day. */
+void dayChanged(void*, Evas_Object* calendar, void*) {
+    std::tm day{};
+    if (elm_calendar_selected_time_get(calendar, &day))
+        host::setReadName(calendar, host::dayText(day));
+}
+
+} // namespace
 
 DEVICE_EXTERN_C_BEGIN
 
@@ -33,7 +46,21 @@ DEVICE_API Evas_Object* elm_calendar_add(Evas_Object* parent) {
             host::setReadTextId(arrow, textId);
     host::followLanguageInCalendar(calendar);
     host::paleDaysGoneBy(calendar);
+    for (const char* event : {"changed", "language,changed"})
+        evas_object_smart_callback_add(calendar, event, dayChanged, nullptr);
+    dayChanged(nullptr, calendar, nullptr);
     return calendar;
+}
+
+DEVICE_API void elm_calendar_selected_time_set(Evas_Object* calendar, std::tm* day) {
+    static const auto stock = reinterpret_cast<decltype(&elm_calendar_selected_time_set)>(
+        dlsym(RTLD_NEXT, "elm_calendar_selected_time_set"));
+    if (!stock || !calendar || !day) {
+        LOG_ERROR("A calendar and a day are needed");
+        return;
+    }
+    stock(calendar, day);
+    dayChanged(nullptr, calendar, nullptr);
 }
 
 DEVICE_EXTERN_C_END

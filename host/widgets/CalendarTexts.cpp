@@ -74,23 +74,30 @@ DayNames fittingDayNames() {
     return dayNames(icu::DateFormatSymbols::NARROW);
 }
 
-/** @return Text for the toolkit to free; null on failure. */
-char* monthText(std::tm* month) {
+/** A day, or what a skeleton asks of it, as the language writes it; empty on failure. */
+std::string written(const std::tm& day, const char16_t* skeleton) {
     UErrorCode status = U_ZERO_ERROR;
     const icu::Locale locale = language();
     const std::unique_ptr<icu::DateTimePatternGenerator> generator(
         icu::DateTimePatternGenerator::createInstance(locale, status));
     if (U_FAILURE(status))
-        return nullptr;
-    const icu::UnicodeString pattern =
-        generator->getBestPattern(UNICODE_STRING_SIMPLE("yMMMM"), status);
+        return "";
+    const icu::UnicodeString pattern = generator->getBestPattern(skeleton, status);
     icu::SimpleDateFormat format(pattern, locale, status);
-    icu::GregorianCalendar day(*icu::TimeZone::getGMT(), status);
-    day.set(month->tm_year + 1900, month->tm_mon, 1, 12, 0);
+    icu::GregorianCalendar calendar(*icu::TimeZone::getGMT(), status);
+    calendar.set(day.tm_year + 1900, day.tm_mon, day.tm_mday, 12, 0);
     format.setTimeZone(*icu::TimeZone::getGMT());
     icu::UnicodeString text;
-    format.format(day.getTime(status), text);
-    return U_SUCCESS(status) ? strdup(utf8(text).c_str()) : nullptr;
+    format.format(calendar.getTime(status), text);
+    return U_SUCCESS(status) ? utf8(text) : "";
+}
+
+/** @return Text for the toolkit to free; null on failure. */
+char* monthText(std::tm* month) {
+    std::tm first = *month;
+    first.tm_mday = 1;
+    const std::string text = written(first, u"yMMMM");
+    return text.empty() ? nullptr : strdup(text.c_str());
 }
 
 void writeTexts(void*, Evas_Object* calendar, void*) {
@@ -106,6 +113,10 @@ void writeTexts(void*, Evas_Object* calendar, void*) {
 }
 
 } // namespace
+
+std::string dayText(const std::tm& day) {
+    return written(day, u"yMMMMEEEEd");
+}
 
 void followLanguageInCalendar(Evas_Object* calendar) {
     writeTexts(nullptr, calendar, nullptr);

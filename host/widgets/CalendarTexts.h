@@ -4,6 +4,9 @@
  */
 #pragma once
 
+#include <ctime>
+#include <string>
+
 #include <Evas.h>
 
 namespace host {
@@ -15,5 +18,8 @@ namespace host {
  * The toolkit takes them from the locale of the C library, which often knows English alone.
  */
 void followLanguageInCalendar(Evas_Object* calendar);
+
+/** @brief A day in words, with its weekday, in the language of the texts. */
+std::string dayText(const std::tm& day);
 
 } // namespace host

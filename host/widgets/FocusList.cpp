@@ -4,6 +4,7 @@
 #include <string_view>
 
 #include "EvasLists.h"
+#include "RowParts.h"
 #include "ThemeNames.h"
 
 namespace host {
@@ -12,11 +13,6 @@ namespace {
 
 Elm_Object_Item* stepFrom(Elm_Object_Item* item, int direction) {
     return direction > 0 ? elm_genlist_item_next_get(item) : elm_genlist_item_prev_get(item);
-}
-
-bool isPressed(const Elm_Object_Item* item) {
-    const Elm_Object_Select_Mode mode = elm_genlist_item_select_mode_get(item);
-    return mode != ELM_OBJECT_SELECT_MODE_NONE && mode != ELM_OBJECT_SELECT_MODE_DISPLAY_ONLY;
 }
 
 bool mayHaveFocus(const Elm_Object_Item* item) {
@@ -56,6 +52,12 @@ FocusBox viewOf(const Evas_Object* list) {
 
 } // namespace
 
+bool canPressRow(const Elm_Object_Item* item) {
+    const Elm_Object_Select_Mode mode = elm_genlist_item_select_mode_get(item);
+    return mayHaveFocus(item) && mode != ELM_OBJECT_SELECT_MODE_NONE &&
+           mode != ELM_OBJECT_SELECT_MODE_DISPLAY_ONLY;
+}
+
 std::optional<FocusBox> boxOfRow(Elm_Object_Item* item) {
     const auto* tracker = static_cast<Evas_Object*>(elm_object_item_track(item));
     const auto box = tracker ? std::optional(boxOf(tracker)) : std::nullopt;
@@ -69,7 +71,7 @@ std::vector<FocusThing> FocusList::inItem(Elm_Object_Item* item) const {
         return {};
     std::vector<FocusThing> things;
     bool rowActs = true;
-    for (FocusThing& thing : thingsIn(membersOf(_list), elm_object_mirrored_get(_list))) {
+    for (FocusThing& thing : thingsIn(contentsOfRow(item), elm_object_mirrored_get(_list))) {
         if (!box->contains(box->middleX(), thing.box.middleY()))
             continue;
         if (isMark(thing) && !actsForItself(thing.object))
@@ -77,7 +79,7 @@ std::vector<FocusThing> FocusList::inItem(Elm_Object_Item* item) const {
         rowActs = rowActs && isMark(thing);
         things.push_back(thing);
     }
-    if (rowActs && isPressed(item))
+    if (rowActs && canPressRow(item))
         things.insert(things.begin(), {FocusKind::Row, _list, _list, item, 0, *box});
     for (std::size_t place = 0; place < things.size(); ++place) {
         things[place].list = _list;

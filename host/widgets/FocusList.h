@@ -38,6 +38,9 @@ private:
     Evas_Object* _list;
 };
 
+/** @brief True for a row that does something when it is tapped. */
+bool canPressRow(const Elm_Object_Item* item);
+
 /** @brief Scrolls the list of a thing so that the thing comes to its middle. */
 void bringToMiddle(const FocusThing& thing);
 

@@ -11,6 +11,7 @@
 #include <Ecore_Input.h>
 #include <Elementary.h>
 
+#include "Accessible.h"
 #include "FocusActions.h"
 #include "FocusList.h"
 #include "FocusRing.h"
@@ -128,6 +129,14 @@ bool FocusNavigator::stopTurning(const Evas_Object* object) {
         return false;
     navigator->startTurning(false);
     return true;
+}
+
+bool FocusNavigator::hasFocus(const Elm_Object_Item* row) {
+    const FocusNavigator* navigator = of(evas_object_evas_get(elm_object_item_widget_get(row)));
+    if (!navigator || !navigator->_idle || !navigator->_root)
+        return false;
+    const auto& thing = navigator->_memories.at(navigator->_root).thing;
+    return thing && thing->kind == FocusKind::Row && thing->item == row;
 }
 
 void FocusNavigator::_windowDeletedCb(void* data, Evas*, Evas_Object*, void*) {
@@ -370,6 +379,8 @@ void FocusNavigator::focus(const std::optional<FocusThing>& thing, bool byKeyboa
         dropToolkitFocus(_window, FocusView(_root).button());
     else
         giveToolkitFocus(*thing);
+    if (thing->kind == FocusKind::Row)
+        tellFocus(thing->item);
     if (thing->list && !evas_object_data_get(thing->list, HEARD_KEY)) {
         evas_object_data_set(thing->list, HEARD_KEY, thing->list);
         evas_object_smart_callback_add(thing->list, REALIZED, _rowRealizedCb, nullptr);
@@ -422,14 +433,22 @@ Eina_Bool FocusNavigator::_idleCb(void* data) {
     // The field has had its Return by now.
     if (std::exchange(self->_endsTyping, false) && self->_root)
         dropToolkitFocus(self->_window, FocusView(self->_root).button());
-    if (focusRoot(self->_window) == self->_root || !self->enterPage())
-        return ECORE_CALLBACK_RENEW;
-    const FocusView view(self->_root);
-    if (const auto thing = self->found(view)) {
-        self->_memories[self->_root].thing = thing;
-        showRing(*thing, false);
-    }
+    if (focusRoot(self->_window) != self->_root)
+        self->_returns = self->enterPage();
+    if (self->_returns && self->_root)
+        self->showReturned();
     return ECORE_CALLBACK_RENEW;
+}
+
+/** A page that slides in hides what it has at first. */
+void FocusNavigator::showReturned() {
+    Memory& memory = _memories.at(_root);
+    const auto thing = found(FocusView(_root));
+    _returns = memory.thing && !thing;
+    if (!thing)
+        return;
+    memory.thing = thing;
+    showRing(*thing, false);
 }
 
 } // namespace host

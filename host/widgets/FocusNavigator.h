@@ -29,6 +29,8 @@ public:
     static void install(Evas_Object* window);
     /** Ends turning in the window of an object; false when nothing was being turned. */
     static bool stopTurning(const Evas_Object* object);
+    /** Whether keys have reached a row. */
+    static bool hasFocus(const Elm_Object_Item* row);
 
     FocusNavigator(const FocusNavigator&) = delete;
     FocusNavigator& operator=(const FocusNavigator&) = delete;
@@ -75,6 +77,7 @@ private:
     void touched(int x, int y);
     void lead(bool keys);
     void hideRings() const;
+    void showReturned();
 
     Evas_Object* _window;
     Evas_Object* _catcher;
@@ -83,6 +86,7 @@ private:
     Ecore_Idle_Enterer* _idle = nullptr; ///< While keys lead.
     Ecore_Timer* _press = nullptr;       ///< While the bezel is pressed on a row.
     bool _turning = false;
+    bool _returns = false;    ///< The page has come, but does not yet show what has the focus.
     bool _endsTyping = false; ///< Return has just gone to a field.
 };
 

@@ -12,6 +12,7 @@
 #include <Elementary.h>
 
 #include "Accessible.h"
+#include "ReadableRow.h"
 #include "RowRim.h"
 #include "ThemeNames.h"
 #include "device/export.h"
@@ -341,7 +342,8 @@ DEVICE_API Evas_Object* elm_genlist_add(Evas_Object* parent) {
         LOG_ERROR("A list needs a parent");
         return nullptr;
     }
-    host::nameRowsForReaders(list);
+    host::makeRowsReadable();
+    host::nameControlsInRows(list);
     watchRest(list);
     evas_object_smart_callback_add(list, "realized", rowRealized, nullptr);
     evas_object_smart_callback_add(list, "scroll", listScrolled, nullptr);

@@ -8,6 +8,7 @@
 
 #include <Elementary.h>
 
+#include "Accessible.h"
 #include "Index.h"
 #include "ThemeNames.h"
 #include "device/export.h"
@@ -25,11 +26,19 @@ constexpr const char* ENTRIES_KEY = "device.index.entries";
 /** The toolkit does not tell what an index has in it. */
 struct Entries {
     std::vector<Elm_Object_Item*> items;
-    int place = -1; ///< Of the one that was turned to last.
+    int place = -1;   ///< Of the one that was turned to last.
+    std::string name; ///< What a screen had called the index before that.
 };
 
 Entries* entriesOf(const Evas_Object* index) {
     return index ? static_cast<Entries*>(evas_object_data_get(index, ENTRIES_KEY)) : nullptr;
+}
+
+/** Screen readers are told where it was turned to. */
+void tellPlace(Evas_Object* index, Entries& entries, const std::string& text) {
+    if (entries.name.empty())
+        entries.name = host::readName(index);
+    host::setReadName(index, entries.name.empty() ? text : entries.name + ", " + text);
 }
 
 void indexDeleted(void* entries, Evas*, Evas_Object* index, void*) {
@@ -105,6 +114,7 @@ bool host::turnIndex(Evas_Object* index, int steps) {
     // Selecting raises what a finger raises.
     elm_index_item_selected_set(entries->items[static_cast<std::size_t>(entries->place)],
                                 EINA_TRUE);
+    tellPlace(index, *entries, indexText(index));
     return true;
 }
 
@@ -153,8 +163,11 @@ DEVICE_API Elm_Object_Item* elm_index_item_append(Evas_Object* obj, const char* 
 DEVICE_API void elm_index_item_clear(Evas_Object* obj) {
     static const auto stock =
         reinterpret_cast<decltype(&elm_index_item_clear)>(dlsym(RTLD_NEXT, "elm_index_item_clear"));
-    if (Entries* entries = entriesOf(obj))
+    if (Entries* entries = entriesOf(obj)) {
+        if (!entries->name.empty())
+            host::setReadName(obj, entries->name);
         *entries = {};
+    }
     if (stock && obj)
         stock(obj);
 }

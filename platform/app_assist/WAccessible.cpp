@@ -40,4 +40,14 @@ void announce(Evas_Object* widget, const std::string& text) {
     }
 }
 
+void endAnnouncement(Evas_Object* widget) {
+    if (widget == nullptr) {
+        return;
+    }
+    setAccessibleName(widget, "");
+    if (elm_config_atspi_mode_get()) {
+        efl_access_state_changed_signal_emit(widget, EFL_ACCESS_STATE_TYPE_SHOWING, EINA_FALSE);
+    }
+}
+
 } // namespace app_assist

@@ -27,4 +27,7 @@ APP_ASSIST_EXPORT void setAccessibleTextId(Evas_Object* widget, const char* text
 /** @brief Lets screen readers say a text that comes and goes by itself. @param widget Shows it. */
 APP_ASSIST_EXPORT void announce(Evas_Object* widget, const std::string& text);
 
+/** @brief Tells screen readers that the text has gone. @param widget Has shown it. */
+APP_ASSIST_EXPORT void endAnnouncement(Evas_Object* widget);
+
 } // namespace app_assist

@@ -1,10 +1,13 @@
 #include "app_assist/WPopupController.h"
 
 #include <array>
+#include <cstdlib>
 
 #include <Elementary.h>
 
 #include <device/eext.h>
+
+#include "app_assist/WAccessible.h"
 
 #define LOG_TAG "app-assist"
 #include "base/Log.h"
@@ -14,6 +17,16 @@ namespace app_assist {
 namespace {
 
 constexpr std::array BUTTON_PARTS = {"button1", "button2", "button3"};
+
+/** A popup is called by its title, also in the next language. */
+void nameByTitle(void* /*data*/, Evas_Object* popup, void* /*info*/) {
+    const char* const title = elm_object_part_text_get(popup, "title,text");
+    char* const plain = title == nullptr ? nullptr : elm_entry_markup_to_utf8(title);
+    if (plain != nullptr) {
+        setAccessibleName(popup, plain);
+    }
+    std::free(plain);
+}
 
 } // namespace
 
@@ -52,6 +65,8 @@ Evas_Object* WPopupController::onCreateView(Evas_Object* parent, void* /*param*/
     if (_properties) {
         _properties(popup);
     }
+    nameByTitle(nullptr, popup, nullptr);
+    evas_object_smart_callback_add(popup, "language,changed", nameByTitle, nullptr);
     if (Evas_Object* const content = _content ? _content(popup) : nullptr) {
         elm_object_content_set(popup, content);
     }

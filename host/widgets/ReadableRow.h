@@ -1,0 +1,22 @@
+/**
+ * @file
+ * @brief Rows as screen readers know them.
+ */
+#pragma once
+
+#include <Elementary.h>
+
+namespace host {
+
+/**
+ * @brief From now on screen readers can press the rows that are made for lists.
+ *
+ * They are also told what a row says, whether its mark is on, and whether keys have reached it. A
+ * row that only takes room is none to them.
+ */
+void makeRowsReadable();
+
+/** @brief Tells screen readers when a row says something else than before. */
+void tellRowName(Elm_Object_Item* row);
+
+} // namespace host
