@@ -28,6 +28,7 @@ QuickPanel::QuickPanel(Evas_Object* window, const std::string& theme,
     : _layout(elm_layout_add(window)), _changed(std::move(changed)) {
     if (!elm_layout_file_set(_layout, theme.c_str(), "simulator/quickpanel"))
         LOG_ERROR("'%s' has no quick panel", theme.c_str());
+    app_assist::prepareAnnouncements(_layout);
     elm_object_domain_translatable_part_text_set(_layout, "panel.title", nullptr, TITLE);
     elm_object_domain_translatable_part_text_set(_layout, "panel.hint", nullptr,
                                                  "IDS_QP_BODY_PRESS_THE_VOLUME_KEYS_TO_CHANGE_IT");

@@ -22,6 +22,7 @@ ToastView::ToastView(Evas_Object* window, const std::string& theme)
     : _layout(elm_layout_add(window)) {
     if (!elm_layout_file_set(_layout, theme.c_str(), "simulator/toast"))
         LOG_ERROR("'%s' has no toast", theme.c_str());
+    app_assist::prepareAnnouncements(_layout);
     evas_object_resize(_layout, FACE_SIZE, FACE_SIZE);
     evas_object_layer_set(_layout, LAYER_TOAST);
     evas_object_show(_layout);

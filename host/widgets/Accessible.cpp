@@ -10,7 +10,6 @@
 
 #include "Accessible.h"
 #include "EvasLists.h"
-#include "ReadableRow.h"
 #include "RowParts.h"
 #include "TimeWheel.h"
 
@@ -39,8 +38,7 @@ void collectControls(Evas_Object* object, std::vector<Evas_Object*>& controls) {
         collectControls(member, controls);
 }
 
-void nameControls(Elm_Object_Item* row) {
-    tellRowName(row);
+void nameControls(const Elm_Object_Item* row) {
     const std::string name = textsOfRow(row);
     if (name.empty())
         return;
@@ -73,10 +71,6 @@ std::vector<Evas_Object*> controlsOfRow(const Elm_Object_Item* row) {
 
 void setReadName(Evas_Object* widget, const std::string& name) {
     efl_access_object_i18n_name_set(widget, name.c_str());
-    tellNameChanged(widget);
-}
-
-void tellNameChanged(Eo* widget) {
     // The toolkit's own macro for it is C.
     static char property[] = "i18n_name";
     if (elm_config_atspi_mode_get())

@@ -20,8 +20,6 @@ void setReadTextId(Evas_Object* widget, const char* textId);
 /** @brief Says that a widget's value is turned up and down. */
 void setReadAsSpinner(Evas_Object* widget);
 
-/** @brief Tells that a widget or a row has another name. */
-void tellNameChanged(Eo* widget);
 /** @brief Tells that keys have reached a row. */
 void tellFocus(Elm_Object_Item* row);
 

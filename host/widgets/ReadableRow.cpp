@@ -68,7 +68,6 @@ std::string namesIn(const Elm_Object_Item* row) {
 /** Whoever asks for a name does not free it. */
 struct RowData {
     Eina_Stringshare* name;
-    Eina_Stringshare* told; ///< As readers know it, which ask once.
 };
 
 /** What it says, or what its screen calls it, or else what is in it. */
@@ -87,7 +86,6 @@ const char* nameOf(const Eo* row, void* data) {
 
 void destroy(Eo* row, void* data) {
     eina_stringshare_del(static_cast<RowData*>(data)->name);
-    eina_stringshare_del(static_cast<RowData*>(data)->told);
     efl_destructor(efl_super(row, readableRowClass()));
 }
 
@@ -140,15 +138,6 @@ bool& hasLists() {
 
 void host::makeRowsReadable() {
     hasLists() = true;
-}
-
-void host::tellRowName(Elm_Object_Item* row) {
-    if (!efl_isa(row, readableRowClass()))
-        return;
-    auto* data = static_cast<RowData*>(efl_data_scope_get(row, readableRowClass()));
-    const bool isKnown = data->told != nullptr;
-    if (eina_stringshare_replace(&data->told, nameOf(row, data)) && isKnown)
-        tellNameChanged(row);
 }
 
 DEVICE_EXTERN_C_BEGIN

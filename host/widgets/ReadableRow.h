@@ -4,8 +4,6 @@
  */
 #pragma once
 
-#include <Elementary.h>
-
 namespace host {
 
 /**
@@ -15,8 +13,5 @@ namespace host {
  * row that only takes room is none to them.
  */
 void makeRowsReadable();
-
-/** @brief Tells screen readers when a row says something else than before. */
-void tellRowName(Elm_Object_Item* row);
 
 } // namespace host

@@ -29,11 +29,16 @@ void setAccessibleTextId(Evas_Object* widget, const char* textId) {
     efl_access_object_i18n_name_set(widget, textId);
 }
 
+void prepareAnnouncements(Evas_Object* widget) {
+    if (widget != nullptr) {
+        efl_access_object_role_set(widget, EFL_ACCESS_ROLE_NOTIFICATION);
+    }
+}
+
 void announce(Evas_Object* widget, const std::string& text) {
     if (widget == nullptr) {
         return;
     }
-    efl_access_object_role_set(widget, EFL_ACCESS_ROLE_NOTIFICATION);
     setAccessibleName(widget, text);
     if (elm_config_atspi_mode_get()) {
         efl_access_state_changed_signal_emit(widget, EFL_ACCESS_STATE_TYPE_SHOWING, EINA_TRUE);

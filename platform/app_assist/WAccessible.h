@@ -24,6 +24,9 @@ APP_ASSIST_EXPORT void setAccessibleName(Evas_Object* widget, const std::string&
  */
 APP_ASSIST_EXPORT void setAccessibleTextId(Evas_Object* widget, const char* textId);
 
+/** @brief Says that a widget will show announcements: readers ask but once what it is. */
+APP_ASSIST_EXPORT void prepareAnnouncements(Evas_Object* widget);
+
 /** @brief Lets screen readers say a text that comes and goes by itself. @param widget Shows it. */
 APP_ASSIST_EXPORT void announce(Evas_Object* widget, const std::string& text);
 

@@ -8,6 +8,13 @@ reader() { timeout 60 "$journeys/reader.py" clock-sim "$@" 2>>"$pictures/reader.
 tree() { reader tree >"$pictures/$1.txt"; }
 # reads FILE LINE: a line of the tree is just this.
 reads() { grep -qxE " *$2" "$pictures/$1.txt" || { sed 's/^/  /' "$pictures/$1.txt" && return 1; }; }
+# hears PATTERN: the reader that listens has been told so.
+hears() { watch_wait 20 grep -qxE "object:state-changed:$1" "$pictures/heard.txt" || { sed 's/^/  /' "$pictures/heard.txt" && return 1; }; }
+listens() {
+    "$journeys/reader.py" clock-sim listen >"$pictures/heard.txt" 2>>"$pictures/reader.log" &
+    watch_pids+=($!)
+    watch_wait 20 grep -q listening "$pictures/heard.txt"
+}
 session_starts() {
     DBUS_SESSION_BUS_ADDRESS=unix:path=$work/bus
     export DBUS_SESSION_BUS_ADDRESS
@@ -22,6 +29,7 @@ check "A display starts" watch_display "$work" || exit 1
 check "A session with a screen reader starts" session_starts
 check "The watch starts" starts
 check "Create is called so" reader find Create
+check "Somebody listens" listens
 check "The list is read" tree 1-alarms
 check "Create is a button" reads 1-alarms 'push button \| Create( \| focused)?'
 check "The reader presses it" reader press Create
@@ -33,7 +41,25 @@ check "A switch has the name of its row and is on" reads 2-editor 'check box \| 
 check "A row out of sight has its name" reads 2-editor 'list item \| Snooze, .*'
 check "The slider tells its value" reads 2-editor 'slider \| Alarm volume, [0-9]+ / 15'
 check "Cancel is a button" reads 2-editor 'push button \| Cancel( \| focused)?'
-check "The reader leaves" reader press Cancel
+check "The reader flips a row" reader press 'Snooze, *'
+check "The reader opens a row" reader press 'Repeat weekly, *'
+check "The repeat screen opens" reader find 'Every Monday'
+check "The reader chooses a day" reader press 'Every Monday'
+check "The repeat screen is read" tree 3-repeat
+check "The day is marked" reads 3-repeat 'list item \| Every Monday \| checked( \| focused)?'
+check "The reader goes back" reader press Back
+check "The editor has the day" reader find 'Repeat weekly, Mon*'
+check "The reader opens the type" reader press 'Alarm type, *'
+check "The popup is called by its title" reader find Type
+check "The reader chooses a type" reader press Vibration
+check "The editor has the type" reader find 'Alarm type, Vibration'
+check "A key leads the focus on" watch_key Tab Tab Tab Tab Tab Tab
+check "The reader is told of the row" hears 'focused \| list item \| Repeat weekly, Mon.*'
+check "The reader sets the alarm" reader press Done
+check "The toast is announced" hears 'showing \| notification \| Alarm set for .*'
+check "The alarm is stored" watch_wait 10 alarms_are 1
+check "It has the day and the type, and no snooze" column_is 'repeat_weekly, type, snooze' '2|1|0'
+check "The alarm is in the list" reader find '06:00*'
 check "The watch ends" watch_stop
 unset DBUS_SESSION_BUS_ADDRESS
 : >"$log"

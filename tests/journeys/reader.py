@@ -1,10 +1,11 @@
 #!/usr/bin/python3
 """A screen reader in small: looks at what an application shows, and presses what it names.
 
-usage: reader.py APPLICATION tree|press NAME|find NAME
+usage: reader.py APPLICATION tree|press NAME|find NAME|listen
 
 "tree" prints a line for each thing: its role, its name and its states. "press" does the first
-action of the thing of that name, "find" succeeds when there is one.
+action of the thing of that name, "find" succeeds when there is one. A name that ends with a star is
+the beginning of one. "listen" prints what is announced and where the focus goes, until it is ended.
 """
 
 import sys
@@ -47,13 +48,34 @@ def line(node, depth):
     return "  " * depth + " | ".join([node.getRoleName(), node.name or "", *words])
 
 
+def is_called(name, wanted):
+    return name.startswith(wanted[:-1]) if wanted.endswith("*") else name == wanted
+
+
+def tell(event):
+    node = event.source
+    if not event.detail1 and "state" in event.type:
+        return
+    try:
+        print(event.type, "|", node.getRoleName(), "|", node.name or "", flush=True)
+    except Exception as gone:  # what has gone meanwhile says nothing any more
+        print(event.type, "|", gone, flush=True)
+
+
+def listen():
+    for event in ("state-changed:showing", "state-changed:focused", "property-change:accessible-name"):
+        pyatspi.Registry.registerEventListener(tell, "object:" + event)
+    print("listening", flush=True)
+    pyatspi.Registry.start()
+
+
 def find(name, wanted):
     """The thing that is called so, once the application shows one."""
     end = time.monotonic() + SECONDS
     while time.monotonic() < end:
         top = application(name)
         for node, _ in things(top) if top else ():
-            if (node.name or "") == wanted:
+            if is_called(node.name or "", wanted):
                 return node
         time.sleep(0.2)
     return None
@@ -61,6 +83,9 @@ def find(name, wanted):
 
 def main():
     name, verb = sys.argv[1:3]
+    if verb == "listen":
+        listen()
+        return
     if verb == "tree":
         top = application(name)
         if not top:
