@@ -12,6 +12,7 @@
 #include "base/CivilTime.h"
 #include "device/vconf.h"
 #include "device_host.h"
+#include "device_settings.h"
 
 #define LOG_TAG "device-host"
 #include "base/Log.h"
@@ -19,15 +20,12 @@
 namespace host {
 namespace {
 
-constexpr const char* SHIFT_KEY = "db/setting/clock_shift";
-constexpr const char* TIME_ZONE_KEY = "db/setting/time_zone";
-
 std::atomic<std::int64_t> shift = 0;
 static_assert(std::atomic<std::int64_t>::is_always_lock_free, "signal handlers may ask the time");
 
 void applyShift() {
     int seconds = 0;
-    vconf_get_int(SHIFT_KEY, &seconds);
+    vconf_get_int(DEVICE_SETTING_CLOCK_SHIFT, &seconds);
     shift.store(seconds, std::memory_order_relaxed);
 }
 
@@ -42,7 +40,7 @@ void setIcuZone(const std::string& zone) {
 }
 
 void applyTimeZone() {
-    char* stored = vconf_get_str(TIME_ZONE_KEY);
+    char* stored = vconf_get_str(DEVICE_SETTING_TIME_ZONE);
     const std::string zone = stored ? stored : "";
     std::free(stored);
     // Without a setting the device is where the computer is.
@@ -73,8 +71,8 @@ void applyClock() {
 }
 
 bool followClock() {
-    return vconf_notify_key_changed(SHIFT_KEY, changedCb, nullptr) == VCONF_OK &&
-           vconf_notify_key_changed(TIME_ZONE_KEY, changedCb, nullptr) == VCONF_OK;
+    return vconf_notify_key_changed(DEVICE_SETTING_CLOCK_SHIFT, changedCb, nullptr) == VCONF_OK &&
+           vconf_notify_key_changed(DEVICE_SETTING_TIME_ZONE, changedCb, nullptr) == VCONF_OK;
 }
 
 void forgetClock() {

@@ -12,6 +12,7 @@
 
 #include "Modems.h"
 #include "device/vconf.h"
+#include "device_settings.h"
 
 #define LOG_TAG "device-host"
 #include "base/Log.h"
@@ -26,7 +27,7 @@ using Clock = std::chrono::steady_clock;
 using Modems = std::vector<host::Modem>;
 
 /** Stands for the network of a computer without a modem. */
-constexpr const char* PLMN_SETTING = "memory/telephony/plmn";
+constexpr const char* PLMN_SETTING = DEVICE_SETTING_NETWORK;
 constexpr const char* SIMULATED_MODEM = "simulated";
 /** As long as this the modems are not asked again: callers ask for them one by one. */
 constexpr auto FRESH = std::chrono::milliseconds(500);

@@ -2,6 +2,7 @@
 
 #include "clock/ClockEventListener.h"
 #include "device/vconf.h"
+#include "device_settings.h"
 
 #define LOG_TAG "clock-sim"
 #include "base/Log.h"
@@ -9,18 +10,17 @@
 namespace simulator {
 
 namespace {
-constexpr const char* KEY = "db/setting/psmode";
 constexpr int OFF = 0;
 constexpr int ULTRA = 2;
 } // namespace
 
 bool setPowerSaving(bool on) {
-    return vconf_set_int(KEY, on ? ULTRA : OFF) == VCONF_OK;
+    return vconf_set_int(DEVICE_SETTING_POWER_SAVING, on ? ULTRA : OFF) == VCONF_OK;
 }
 
 bool isPowerSaving() {
     int mode = OFF;
-    return vconf_get_int(KEY, &mode) == VCONF_OK && mode == ULTRA;
+    return vconf_get_int(DEVICE_SETTING_POWER_SAVING, &mode) == VCONF_OK && mode == ULTRA;
 }
 
 void togglePowerSaving() {

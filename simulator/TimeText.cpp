@@ -8,12 +8,13 @@
 
 #include "clock/ClockIcuDataModel.h"
 #include "device/vconf.h"
+#include "device_settings.h"
 
 namespace simulator {
 
 bool isTwelveHour() {
     int form = 0;
-    return vconf_get_int("db/menu_widget/regionformat_time1224", &form) == VCONF_OK && form == 1;
+    return vconf_get_int(DEVICE_SETTING_TIME_FORM, &form) == VCONF_OK && form == 1;
 }
 
 std::string timeOfDayText(int hour, int minute, bool twelveHour) {
