@@ -106,6 +106,26 @@ TEST_F(MotionTest, UltraPowerSavingMovesNothing) {
     EXPECT_GT(sliding, knob(check));
 }
 
+TEST_F(MotionTest, AListScrollsOrJumpsToWhatItBringsIn) {
+    createAlarm();
+    const auto scrolled = [this] {
+        int y = 0;
+        elm_scroller_region_get(genlist(), nullptr, &y, nullptr, nullptr);
+        return y;
+    };
+    constexpr int FAR = 240;
+    elm_scroller_region_bring_in(genlist(), 0, FAR, Stage::SIZE, Stage::SIZE);
+    Stage::frames(3);
+    EXPECT_GT(scrolled(), 0);
+    EXPECT_LT(scrolled(), FAR);
+    stage().settle();
+    EXPECT_EQ(scrolled(), FAR);
+    setMotion(false);
+    elm_scroller_region_bring_in(genlist(), 0, 0, Stage::SIZE, Stage::SIZE);
+    Stage::frames(3);
+    EXPECT_EQ(scrolled(), 0);
+}
+
 TEST_F(MotionTest, APageComesAndGoesWithAndWithoutMotion) {
     createAlarm();
     std::size_t repeat[2] = {};
