@@ -13,6 +13,7 @@
 
 #include "base/MessageLocale.h"
 #include "device/vconf.h"
+#include "device_settings.h"
 #include "widgets/Faces.h"
 #include "widgets/FontLanguage.h"
 
@@ -26,7 +27,7 @@ namespace {
 constexpr const char* textDomain = "clock";
 constexpr const char* anyText = "IDS_COM_BODY_ALARM";
 constexpr const char* neutralLocale = "C.UTF-8";
-constexpr const char* languageKey = "db/setting/language";
+constexpr const char* languageKey = DEVICE_SETTING_LANGUAGE;
 constexpr const char* languageVariable = "CLOCK_LANGUAGE";
 
 /** What the device has made of LANGUAGE, and from what. */
@@ -136,7 +137,8 @@ void tellToolkit() {
 
 void languageChangedCb(keynode_t*, void*) {
     const std::string setting = languageSetting();
-    if (setting == spoken().setting)
+    // A choice ends what this run was started in, also when it is that of the setting.
+    if (setting == spoken().setting && variable(languageVariable).empty())
         return;
     spoken().setting = setting;
     setenv(languageVariable, "", 1);

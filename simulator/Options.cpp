@@ -6,6 +6,7 @@
 #include <cstring>
 
 #include "Keys.h"
+#include "control/DeviceSettings.h"
 #include "script/Commands.h"
 
 namespace simulator {
@@ -73,11 +74,14 @@ std::string applyCommand(Options& options, const std::string& value) {
     return value.empty() ? "needs a command" : "";
 }
 
-/** Keeps a setting for the device, which knows what is wrong with it. */
+/** Keeps a setting for the device. */
 template <const char* SETTING>
 std::string applySetting(Options& options, const std::string& value) {
     options.settings.emplace_back(SETTING, value);
-    return value.empty() ? "needs a value" : "";
+    if (value.empty())
+        return "needs a value";
+    const std::string problem = checkDevice(SETTING, value);
+    return problem.empty() ? "" : "cannot be used: " + problem;
 }
 
 constexpr char REGION[] = "region";

@@ -1,6 +1,5 @@
 #include "ClockShift.h"
 
-#include <array>
 #include <charconv>
 #include <cstdio>
 #include <limits>
@@ -110,14 +109,6 @@ std::string clockValue(int shift) {
         return "real";
     std::string value(shift > 0 ? "+" : "");
     return value.append(std::to_string(shift));
-}
-
-std::string clockReading(const ClockState& state) {
-    const auto shown = base::toCivil(state.realNow + state.shift, state.timeZone);
-    std::array<char, 64> text{};
-    std::snprintf(text.data(), text.size(), "%04d-%02d-%02d %02d:%02d:%02d", shown.date.year,
-                  shown.date.month, shown.date.day, shown.hour, shown.minute, shown.second);
-    return text.data();
 }
 
 } // namespace simulator

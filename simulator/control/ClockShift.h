@@ -38,7 +38,4 @@ ClockWish clockWish(const std::string& value, const ClockState& state);
 /** @brief A shift as a value that can be wished for: "real" or "+3600". */
 std::string clockValue(int shift);
 
-/** @brief What the device shows at a shift: "2026-11-21 14:05:09". */
-std::string clockReading(const ClockState& state);
-
 } // namespace simulator

@@ -181,6 +181,20 @@ TEST_F(LiveDeviceLanguageTest, TheLocaleStaysTheEnvironments) {
         setenv("LC_ALL", before.c_str(), 1);
 }
 
+TEST_F(LiveDeviceLanguageTest, ChoosingTheStoredLanguageEndsThatOfOneRun) {
+    vconf_set_str(LANGUAGE_KEY, "de");
+    device_host_shutdown();
+    setenv("CLOCK_LANGUAGE", "es", 1);
+    start();
+    ASSERT_EQ(device_host_init_toolkit(), 0);
+    EXPECT_EQ(cancel(), "Cancelar");
+    // It is written for a moment only, as nobody is told of a value that stays.
+    vconf_set_str(LANGUAGE_KEY, "");
+    choose("de");
+    EXPECT_EQ(cancel(), "Abbrechen");
+    EXPECT_STREQ(std::getenv("CLOCK_LANGUAGE"), "");
+}
+
 TEST_F(LiveDeviceLanguageTest, AChangeEndsTheLanguageOfOneRun) {
     device_host_shutdown();
     setenv("CLOCK_LANGUAGE", "es", 1);

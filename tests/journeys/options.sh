@@ -21,7 +21,7 @@ runs() {
 says_one_line() { is "$(grep -ac '^clock-sim: ' "$work/err")" 1 && contains "$(grep -a '^clock-sim: ' "$work/err")" "$1"; }
 
 check "--help ends well" runs 0 --help
-for word in --data --resources --language --12h --24h --create --edit --world-clock --pick-city --set-volume --power-saving --version Escape F2 F3 F4 F5 F6 F7 F8 F9 F10 "Exit status"; do
+for word in --data --resources --language --12h --24h --create --edit --world-clock --pick-city --set-volume --power-saving --region --time-zone --clock --network --motion --panel --script --command --version Escape F2 F3 F4 F5 F6 F7 F8 F9 F10 "Exit status"; do
     check "--help tells about $word" contains "$out" "$word"
 done
 check "--help is quiet on the error stream" is "$err" ""
@@ -54,6 +54,18 @@ check "Power saving is on or off" runs 2 --power-saving 2
 check "The two words are named" says_one_line "needs 'on' or 'off'"
 check "A watch that only sets opens no editor" runs 2 --set-volume 3 --create
 check "The first mistake counts, --help or not" runs 2 --loud --help
+check "A region that is none is refused" runs 2 --data "$work/data" --region Germany
+check "The region is named" says_one_line "option '--region' cannot be used: 'Germany' is not a language and a country"
+check "A time zone that is none is refused" runs 2 --data "$work/data" --time-zone Mars/Olympus
+check "The zone is named" says_one_line "'Mars/Olympus' is not a time zone"
+check "A time that is none is refused" runs 2 --data "$work/data" --clock "2027-02-29 10:00"
+check "The time is named" says_one_line "there is no 2027-02-29 10:00 in the calendar"
+check "A network that is none is refused" runs 2 --data "$work/data" --network 262
+check "The network is named" says_one_line "'262' is not a network"
+check "Motion is on or off" runs 2 --data "$work/data" --motion=slow
+check "Both are named" says_one_line "'slow' is neither on nor off"
+check "A good setting before a bad one is not made" runs 2 --data "$work/data" --region de_DE --motion slow
+check "Nothing was written" test ! -e "$work/data"
 
 mkdir "$work/file-in-the-way.d" && : >"$work/file-in-the-way"
 check "A data folder that is a file is refused" runs 1 --data "$work/file-in-the-way"

@@ -2,6 +2,7 @@
 
 #include "control/DeviceSettings.h"
 
+#include <cstdlib>
 #include <optional>
 #include <string>
 #include <utility>
@@ -10,6 +11,7 @@
 #include <gmock/gmock.h>
 
 #include "control/Languages.h"
+#include "device/vconf.h"
 #include "support/ScreenTest.h"
 #include "support/VirtualClock.h"
 
@@ -89,6 +91,8 @@ TEST_F(DeviceSettingsTest, aBadValueIsRefusedInOneSentenceAndChangesNothing) {
         {"region", "de_", "'de_' is not a language and a country such as de_DE"},
         {"region", "de_ZZZZ", "'de_ZZZZ' is not a language and a country such as de_DE"},
         {"region", "de_DE.UTF-8", "'de_DE.UTF-8' is not a language and a country such as de_DE"},
+        {"region", "de_DE@euro", "'de_DE@euro' is not a language and a country such as de_DE"},
+        {"region", "de_DE x", "'de_DE x' is not a language and a country such as de_DE"},
         {"time-form", "13", "'13' is neither 12 nor 24"},
         {"power-saving", "yes", "'yes' is neither on nor off"},
         {"volume", "16", "'16' is not a level from 0 to 15"},
@@ -96,6 +100,7 @@ TEST_F(DeviceSettingsTest, aBadValueIsRefusedInOneSentenceAndChangesNothing) {
         {"volume", "7 ", "'7 ' is not a level from 0 to 15"},
         {"volume", "99999999999", "'99999999999' is not a level from 0 to 15"},
         {"network", "2620", "'2620' is not a network of five or six digits such as 26201"},
+        {"network", "2620111", "'2620111' is not a network of five or six digits such as 26201"},
         {"network", "26-201", "'26-201' is not a network of five or six digits such as 26201"},
         {"time-zone", "Berlin", "'Berlin' is not a time zone such as Europe/Berlin"},
         {"time-zone", "", "'' is not a time zone such as Europe/Berlin"},
@@ -139,6 +144,38 @@ TEST_F(DeviceSettingsTest, aSettingThatCannotBeWrittenIsToldOf) {
                   "the setting cannot be written; the log tells why")
             << setting;
     }
+}
+
+TEST_F(DeviceSettingsTest, theLanguageOfARunGivesWayToThatOfTheSettingToo) {
+    device().setSetting("db/setting/language", std::string("de"));
+    int changes = 0;
+    vconf_notify_key_changed(
+        "db/setting/language", [](keynode_t*, void* count) { ++*static_cast<int*>(count); },
+        &changes);
+    EXPECT_EQ(simulator::setDevice("language", "de"), "");
+    device().deliverChanges();
+    EXPECT_EQ(changes, 0) << "nothing was to change";
+    setenv("CLOCK_LANGUAGE", "en", 1);
+    EXPECT_EQ(simulator::deviceSetting("language"), "en");
+    EXPECT_EQ(simulator::setDevice("language", "de"), "");
+    device().deliverChanges();
+    EXPECT_GT(changes, 0) << "the device did not hear of it";
+    EXPECT_EQ(device().setting("db/setting/language"), Stored(std::string("de")));
+    device().fail("vconf_set_str");
+    EXPECT_EQ(simulator::setDevice("language", "de"),
+              "the setting cannot be written; the log tells why");
+    unsetenv("CLOCK_LANGUAGE");
+}
+
+TEST_F(DeviceSettingsTest, aValueCanBeCheckedWithoutADevice) {
+    const std::size_t calls = device().calls().size();
+    EXPECT_EQ(simulator::checkDevice("region", "de_DE"), "");
+    EXPECT_EQ(simulator::checkDevice("clock", "before-dst"), "");
+    EXPECT_EQ(simulator::checkDevice("clock", "before-midnight"), "");
+    EXPECT_EQ(simulator::checkDevice("clock", "2027-02-29 10:00"),
+              "there is no 2027-02-29 10:00 in the calendar");
+    EXPECT_EQ(simulator::checkDevice("mood", "good"), "there is no setting 'mood'");
+    EXPECT_EQ(device().calls().size(), calls);
 }
 
 TEST_F(DeviceSettingsTest, theVolumeIsThatOfAlarms) {

@@ -73,6 +73,27 @@ TEST(SimulatorOptions, settingsOfTheDeviceAreTakenInTheirOrder) {
     EXPECT_FALSE(options.onlySets());
 }
 
+TEST(SimulatorOptions, aSettingsBadValueMakesNoSense) {
+    using Pair = std::pair<const char*, const char*>;
+    for (const auto& [option, value] : std::vector<Pair>{{"--region", "Germany"},
+                                                         {"--time-zone", "Berlin"},
+                                                         {"--clock", "tomorrow"},
+                                                         {"--network", "12"},
+                                                         {"--motion", "slow"}}) {
+        const std::string error = parseOptions({option, value}).error;
+        EXPECT_TRUE(error.starts_with(std::string("option '") + option + "' cannot be used: '"))
+            << error;
+        EXPECT_NE(error.find(std::string("'") + value + "' is "), std::string::npos) << error;
+    }
+    for (const auto& [option, value] : std::vector<Pair>{{"--region", "de_DE"},
+                                                         {"--time-zone", "Asia/Kolkata"},
+                                                         {"--clock", "before-dst"},
+                                                         {"--clock", "2026-12-31 23:59"},
+                                                         {"--network", "none"},
+                                                         {"--motion", "off"}})
+        EXPECT_EQ(parseOptions({option, value}).error, "") << option << " " << value;
+}
+
 TEST(SimulatorOptions, thePanelOpensByItselfOrAsTold) {
     EXPECT_EQ(parseOptions({}).panel, std::nullopt);
     EXPECT_EQ(parseOptions({"--panel"}).panel, true);
