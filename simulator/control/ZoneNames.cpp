@@ -2,7 +2,10 @@
 
 #include <algorithm>
 #include <cctype>
+#include <cstdlib>
+#include <fstream>
 #include <memory>
+#include <sstream>
 
 #include <unicode/ucal.h>
 #include <unicode/uenum.h>
@@ -16,18 +19,46 @@ struct EnumerationDeleter {
     void operator()(UEnumeration* names) const { uenum_close(names); }
 };
 
-std::vector<std::string> allZones() {
+/** The places of the system's time-zone files, under the names that they have today. */
+std::vector<std::string> placesOfSystem() {
+    const char* folder = std::getenv("TZDIR");
+    std::ifstream table(std::string(folder == nullptr ? "/usr/share/zoneinfo" : folder) +
+                        "/zone.tab");
+    std::vector<std::string> zones;
+    for (std::string line; std::getline(table, line);) {
+        if (line.starts_with('#'))
+            continue;
+        std::string country;
+        std::string place;
+        std::string name;
+        std::istringstream(line) >> country >> place >> name;
+        zones.push_back(name);
+    }
+    return zones;
+}
+
+/** ICU keeps some names that have changed since: for systems without the table of places. */
+std::vector<std::string> placesOfIcu() {
     UErrorCode status = U_ZERO_ERROR;
     const std::unique_ptr<UEnumeration, EnumerationDeleter> names(ucal_openTimeZoneIDEnumeration(
         UCAL_ZONE_TYPE_CANONICAL_LOCATION, nullptr, nullptr, &status));
-    std::vector<std::string> zones{"UTC"};
+    std::vector<std::string> zones;
     while (U_SUCCESS(status)) {
         const char* name = uenum_next(names.get(), nullptr, &status);
         if (name == nullptr)
             break;
-        if (base::isTimeZone(name))
-            zones.emplace_back(name);
+        zones.emplace_back(name);
     }
+    return zones;
+}
+
+std::vector<std::string> allZones() {
+    std::vector<std::string> zones = placesOfSystem();
+    if (zones.empty())
+        zones = placesOfIcu();
+    zones.emplace_back("UTC");
+    std::erase_if(zones, [](const std::string& zone) { return !base::isTimeZone(zone); });
+    std::sort(zones.begin(), zones.end());
     return zones;
 }
 

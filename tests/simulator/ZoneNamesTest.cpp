@@ -2,6 +2,7 @@
 
 #include "control/ZoneNames.h"
 
+#include <cstdlib>
 #include <string>
 #include <vector>
 
@@ -22,6 +23,29 @@ TEST(ZoneNamesTest, anyPartOfANameFindsIt) {
     EXPECT_THAT(zonesMatching("utc", 9), Contains("UTC"));
     EXPECT_THAT(zonesMatching("", 9), IsEmpty());
     EXPECT_THAT(zonesMatching("no such place", 9), IsEmpty());
+}
+
+TEST(ZoneNamesTest, placesHaveTheNamesOfToday) {
+    EXPECT_THAT(zonesMatching("kolkata", 9), ElementsAre("Asia/Kolkata"));
+    EXPECT_THAT(zonesMatching("ho chi", 9), ElementsAre("Asia/Ho_Chi_Minh"));
+    EXPECT_THAT(zonesMatching("yangon", 9), ElementsAre("Asia/Yangon"));
+    EXPECT_THAT(zonesMatching("kathmandu", 9), ElementsAre("Asia/Kathmandu"));
+    EXPECT_THAT(zonesMatching("kyiv", 9), ElementsAre("Europe/Kyiv"));
+    EXPECT_THAT(zonesMatching("oslo", 9), ElementsAre("Europe/Oslo"));
+    for (const char* old : {"calcutta", "saigon", "rangoon", "katmandu", "kiev"})
+        EXPECT_THAT(zonesMatching(old, 9), IsEmpty()) << old;
+}
+
+TEST(ZoneNamesTest, aSystemWithoutATableOfPlacesHasOthers) {
+    // Read once in a process, so in another one.
+    EXPECT_EXIT(
+        {
+            setenv("TZDIR", "/nowhere", 1);
+            const auto zones = zonesMatching("/", 1000);
+            const bool some = zones.size() > 300 && zonesMatching("berlin", 9).size() == 1;
+            std::exit(some ? 0 : 1);
+        },
+        testing::ExitedWithCode(0), "");
 }
 
 TEST(ZoneNamesTest, citiesThatBeginSoComeFirst) {
