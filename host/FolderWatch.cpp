@@ -77,20 +77,24 @@ std::vector<std::string> FolderWatch::readChanges() {
     return names;
 }
 
+void FolderWatch::deliver() {
+    // Copies: the callback may destroy the watch.
+    const auto alive = _alive;
+    const auto changed = _changed;
+    for (const std::string& name : readChanges()) {
+        changed(name);
+        if (!*alive)
+            break;
+    }
+}
+
 Eina_Bool FolderWatch::_readableCb(void* data, Ecore_Fd_Handler* /*handler*/) {
     auto* self = static_cast<FolderWatch*>(data);
     if (!self) {
         LOG_ERROR("Data is NULL !!");
         return ECORE_CALLBACK_CANCEL;
     }
-    // Copies: the callback may destroy the watch.
-    const auto alive = self->_alive;
-    const auto changed = self->_changed;
-    for (const std::string& name : self->readChanges()) {
-        changed(name);
-        if (!*alive)
-            break;
-    }
+    self->deliver();
     return ECORE_CALLBACK_RENEW;
 }
 

@@ -32,6 +32,9 @@ public:
      */
     int add(const std::string& folder, unsigned more = 0);
 
+    /** @brief Tells of all changes up to now, without waiting for the main loop. */
+    void deliver();
+
 private:
     static Eina_Bool _readableCb(void* data, Ecore_Fd_Handler* handler);
     std::vector<std::string> readChanges();

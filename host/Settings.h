@@ -6,6 +6,9 @@
 
 namespace host {
 
+/** Runs the callbacks of changes that were made before, without waiting for the main loop. */
+void deliverSettingChanges();
+
 /** Drops every change callback. */
 void forgetSettingCallbacks();
 

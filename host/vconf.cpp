@@ -173,6 +173,7 @@ public:
         _byKey[key].push_back(std::move(run));
         return 0;
     }
+    void deliver() { _watch.deliver(); }
 
 private:
     void fileChanged(const std::string& fileName) {
@@ -222,6 +223,11 @@ std::unique_ptr<Callbacks>& callbacks() {
 } // namespace
 
 namespace host {
+
+void deliverSettingChanges() {
+    if (callbacks())
+        callbacks()->deliver();
+}
 
 void forgetSettingCallbacks() {
     callbacks().reset();

@@ -20,7 +20,7 @@ DEVICE_API char* device_remote_folder(void);
  * @brief Makes this process, and the applications that it starts from now on, listen in a folder.
  *
  * After the toolkit's start. device_host_init_toolkit() does it for a started application.
- * @param folder An existing folder of the user's own.
+ * @param folder An existing folder of the user's own; null to listen no longer.
  * @return 0, or a negative errno.
  */
 DEVICE_API int device_remote_listen(const char* folder);
@@ -43,5 +43,11 @@ DEVICE_API void device_remote_set_request_callback(device_remote_request_cb call
  * @return 0, or a negative errno. What becomes of it is not told.
  */
 DEVICE_API int device_remote_send(const char* const* words, int count);
+
+/**
+ * @brief Sends a request to every application of the device, this one included.
+ * @return 0, or the last negative errno; the others have got it then.
+ */
+DEVICE_API int device_remote_send_to_all(const char* const* words, int count);
 
 DEVICE_EXTERN_C_END

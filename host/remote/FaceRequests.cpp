@@ -10,7 +10,9 @@
 #include <Elementary.h>
 #include <libintl.h>
 
+#include "../HomeScreen.h"
 #include "../Launch.h"
+#include "../Settings.h"
 #include "../widgets/TimePicker.h"
 #include "FaceAgent.h"
 #include "FaceInput.h"
@@ -84,13 +86,17 @@ Words key(const Words& request) {
     return {""};
 }
 
-/** texts: for each text its area, what is seen of it, "covered" or nothing, and itself. */
+/**
+ * texts: for each text its area, what is seen of it, "covered" or nothing, "faint" or nothing, and
+ * itself.
+ */
 Words texts(const Words& /*request*/) {
     Words answer{""};
     for (const FaceText& text : faceTexts(ecore_evas_get(faceWindow()))) {
         append(answer, text.area);
         append(answer, text.seen);
         answer.emplace_back(text.covered ? "covered" : "");
+        answer.emplace_back(text.faint ? "faint" : "");
         answer.push_back(text.text);
     }
     return answer;
@@ -147,6 +153,20 @@ Words translate(const Words& request) {
     return text == request[1] ? Words{"there is no text " + request[1]} : Words{"", text};
 }
 
+/** home on|off: nobody looks at the application any more, or somebody does again. */
+Words home(const Words& request) {
+    if (request[1] != "on" && request[1] != "off")
+        return {"home is on or off"};
+    showHome(faceWindow(), request[1] == "on");
+    return {""};
+}
+
+/** settings: answers when all that was written before has reached this process. */
+Words settings(const Words& /*request*/) {
+    deliverSettingChanges();
+    return {""};
+}
+
 /** launches: the processes that were started from here. */
 Words launches(const Words& /*request*/) {
     Words answer{""};
@@ -171,7 +191,7 @@ struct Request {
     Words (*act)(const Words& request);
 };
 
-constexpr std::array<Request, 9> REQUESTS{{
+constexpr std::array<Request, 11> REQUESTS{{
     {"pointer", 5, true, pointer},
     {"bezel", 4, true, bezel},
     {"key", 4, true, key},
@@ -179,6 +199,8 @@ constexpr std::array<Request, 9> REQUESTS{{
     {"wheels", 1, true, wheels},
     {"typing", 1, true, typing},
     {"picture", 1, true, picture},
+    {"home", 2, true, home},
+    {"settings", 1, false, settings},
     {"translate", 2, false, translate},
     {"launches", 1, false, launches},
 }};

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <array>
+#include <cmath>
 #include <cstdlib>
 #include <string_view>
 #include <utility>
@@ -51,6 +52,50 @@ Area geometryOf(const Evas_Object* object) {
     Area area;
     evas_object_geometry_get(object, &area.x, &area.y, &area.width, &area.height);
     return area;
+}
+
+/** What a map makes of an area of its object. Such maps only move and scale. */
+Area mapped(const Area& area, const Evas_Object* object) {
+    constexpr int CORNERS = 4;
+    constexpr int LOWER_RIGHT = 2;
+    const Evas_Map* map = evas_object_map_get(object);
+    const Area whole = geometryOf(object);
+    if (!map || evas_map_count_get(map) != CORNERS || whole.isEmpty())
+        return area;
+    int left = 0;
+    int top = 0;
+    int right = 0;
+    int bottom = 0;
+    evas_map_point_coord_get(map, 0, &left, &top, nullptr);
+    evas_map_point_coord_get(map, LOWER_RIGHT, &right, &bottom, nullptr);
+    const double scaleX = static_cast<double>(right - left) / whole.width;
+    const double scaleY = static_cast<double>(bottom - top) / whole.height;
+    const auto rounded = [](double number) {
+        return static_cast<int>(std::lround(number));
+    };
+    return {rounded(left + scaleX * (area.x - whole.x)), rounded(top + scaleY * (area.y - whole.y)),
+            rounded(scaleX * area.width), rounded(scaleY * area.height)};
+}
+
+/** Where an object is drawn: rows near the rim are drawn smaller than they are. */
+Area drawnArea(const Evas_Object* object) {
+    Area area = geometryOf(object);
+    for (const Evas_Object* at = object; at; at = evas_object_smart_parent_get(at))
+        if (evas_object_map_enable_get(at))
+            area = mapped(area, at);
+    return area;
+}
+
+/** How much of an object's colours its maps leave, 0 to 255. */
+int opacityOf(const Evas_Object* object) {
+    int opacity = 255;
+    for (const Evas_Object* at = object; at; at = evas_object_smart_parent_get(at)) {
+        int own = 255;
+        if (evas_object_map_enable_get(at))
+            evas_map_point_color_get(evas_object_map_get(at), 0, nullptr, nullptr, nullptr, &own);
+        opacity = std::min(opacity, own);
+    }
+    return opacity;
 }
 
 Area intersection(const Area& a, const Area& b) {
@@ -121,8 +166,9 @@ void appendText(Evas_Object* object, void* data) {
     const Area seen = text.empty() ? Area{} : seenArea(object);
     if (seen.isEmpty())
         return;
+    constexpr int READABLE = 128;
     static_cast<std::vector<FaceText>*>(data)->push_back(
-        {text, geometryOf(object), seen, isCovered(object, seen)});
+        {text, drawnArea(object), seen, isCovered(object, seen), opacityOf(object) < READABLE});
 }
 
 } // namespace
@@ -131,13 +177,15 @@ Area seenArea(const Evas_Object* object) {
     Evas* canvas = evas_object_evas_get(object);
     Area face;
     evas_output_size_get(canvas, &face.width, &face.height);
-    Area area = intersection(geometryOf(object), face);
+    if (opacityOf(object) == 0)
+        return {};
+    Area area = intersection(drawnArea(object), face);
     for (const Evas_Object* at = object; at; at = evas_object_clip_get(at)) {
         int alpha = 0;
         evas_object_color_get(at, nullptr, nullptr, nullptr, &alpha);
         if (!evas_object_visible_get(at) || alpha == 0)
             return {};
-        area = intersection(area, geometryOf(at));
+        area = intersection(area, drawnArea(at));
     }
     // A smart object hides its members without touching them.
     for (const Evas_Object* at = evas_object_smart_parent_get(object); at;

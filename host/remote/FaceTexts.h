@@ -22,9 +22,10 @@ struct Area {
 /** A text that can be seen, at least in part. */
 struct FaceText {
     std::string text;
-    Area area;            ///< All of it.
+    Area area;            ///< All of it, where and as large as it is drawn.
     Area seen;            ///< What is left of it inside the face and its clippers.
     bool covered = false; ///< A touch of its middle gets something else that lies above.
+    bool faint = false;   ///< It has faded so far toward the rim that it can hardly be read.
 };
 
 /** @brief The texts from the top to the bottom. */

@@ -6,6 +6,7 @@
 #include <cstring>
 #include <filesystem>
 #include <memory>
+#include <optional>
 
 #include <sys/socket.h>
 #include <unistd.h>
@@ -47,6 +48,22 @@ int sendTo(int channel, const Words& words) {
     return sent == static_cast<ssize_t>(message->size()) ? 0 : -EIO;
 }
 
+/** @return Nothing when nobody listens there any more. */
+std::optional<int> sendToFace(const std::string& folder, const std::string& face,
+                              const Words& request) {
+    const int channel = base::connectTo(folder, face);
+    if (channel < 0)
+        return std::nullopt;
+    const int result = sendTo(channel, request);
+    close(channel);
+    return result;
+}
+
+void doHere(const Words& request) {
+    // Nothing that is asked for so needs any time.
+    const Work work = doRequest(request, [](const Words&) {});
+}
+
 } // namespace
 
 Words askProgram(const Words& words) {
@@ -78,7 +95,10 @@ char* device_remote_folder(void) {
 }
 
 int device_remote_listen(const char* folder) {
-    return folder ? host::FaceAgent::listen(folder) : -EINVAL;
+    if (folder)
+        return host::FaceAgent::listen(folder);
+    host::FaceAgent::end();
+    return 0;
 }
 
 void device_remote_set_request_callback(device_remote_request_cb callback, void* data) {
@@ -92,15 +112,26 @@ int device_remote_send(const char* const* words, int count) {
         for (const std::string& face : host::facesIn(own->folder())) {
             if (face == own->name())
                 break;
-            const int channel = base::connectTo(own->folder(), face);
-            if (channel < 0)
-                continue;
-            const int result = host::sendTo(channel, request);
-            close(channel);
-            return result;
+            if (const auto result = host::sendToFace(own->folder(), face, request))
+                return *result;
         }
     }
-    // Nothing that is asked for so needs any time.
-    const host::Work work = host::doRequest(request, [](const host::Words&) {});
+    host::doHere(request);
     return 0;
+}
+
+int device_remote_send_to_all(const char* const* words, int count) {
+    const host::Words request(words, words + count);
+    int result = 0;
+    const host::FaceAgent* own = host::FaceAgent::get();
+    const std::string folder = own ? own->folder() : "";
+    const std::string name = own ? own->name() : "";
+    for (const std::string& face : host::facesIn(folder)) {
+        if (face == name)
+            continue;
+        if (const int sent = host::sendToFace(folder, face, request).value_or(0); sent < 0)
+            result = sent;
+    }
+    host::doHere(request);
+    return result;
 }

@@ -83,8 +83,16 @@ bool RunningWatch::isChanging() {
     });
 }
 
+void RunningWatch::deliverSettings() {
+    const auto all = faces();
+    for (const Channel& face : all)
+        ask(face, {"settings"});
+}
+
 std::string RunningWatch::waitStill(double seconds) {
     const double end = now() + seconds;
+    // What another process has set a moment ago may not have been noticed yet.
+    deliverSettings();
     std::string why = "an application comes or goes";
     while (!faces().empty()) {
         const Channel front = _faces.back();

@@ -33,6 +33,8 @@ private:
     Reply ask(const Channel& face, const Request& request) const;
     /** True while an application that was started does not listen yet, or goes. */
     bool isChanging();
+    /** Returns when every application has noticed the settings that were made before. */
+    void deliverSettings();
 
     std::string _folder;
     std::vector<Channel> _faces;

@@ -71,12 +71,13 @@ std::string ScriptRun::key(const std::string& name, const std::string& text, boo
 }
 
 std::string ScriptRun::readTexts(std::vector<VisibleText>& texts) {
-    constexpr std::size_t WORDS = 10;
+    constexpr std::size_t WORDS = 11;
     const Reply reply = _device.askFront({"texts"});
     texts.clear();
     for (std::size_t at = 0; at + WORDS <= reply.values.size(); at += WORDS)
-        texts.push_back({reply.values[at + 9], areaAt(reply.values, at),
-                         areaAt(reply.values, at + 4), !reply.values[at + 8].empty()});
+        texts.push_back({reply.values[at + 10], areaAt(reply.values, at),
+                         areaAt(reply.values, at + 4), !reply.values[at + 8].empty(),
+                         !reply.values[at + 9].empty()});
     return reply.problem;
 }
 

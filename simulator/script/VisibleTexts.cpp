@@ -62,7 +62,7 @@ std::string quoted(const VisibleText& text) {
 } // namespace
 
 bool VisibleText::isFullySeen() const {
-    return !covered && seen == area && isOnFace(area);
+    return !covered && !faint && seen == area && isOnFace(area);
 }
 
 std::string asRead(const std::string& text) {

@@ -25,11 +25,12 @@ struct FaceArea {
 /** A text that can be seen, at least in part. */
 struct VisibleText {
     std::string text;
-    FaceArea area;        ///< All of it.
+    FaceArea area;        ///< All of it, as large as it is drawn.
     FaceArea seen;        ///< What can be seen of it.
     bool covered = false; ///< A touch of its middle gets something else.
+    bool faint = false;   ///< It has faded toward the rim.
 
-    /** True when all of it lies on the round face and nothing hides any of it. */
+    /** True when all of it lies on the round face, and it can be read and touched. */
     bool isFullySeen() const;
 };
 

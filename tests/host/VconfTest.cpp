@@ -14,6 +14,7 @@
 #include "Helper.h"
 #include "device/vconf.h"
 #include "device_host.h"
+#include "device_remote.h"
 
 namespace fs = std::filesystem;
 
@@ -244,6 +245,18 @@ TEST_F(Vconf, AChangeByAnotherProcessRunsTheCallback) {
     int value = 0;
     vconf_get_int(formatKey, &value);
     EXPECT_EQ(value, 2);
+}
+
+TEST_F(Vconf, WhoeverAsksForItGetsAllEarlierChangesAtOnce) {
+    ChangeLog changes;
+    changes.watch(formatKey);
+    EXPECT_EQ(waitFor(startHelper({"set-int", formatKey, "2"})), 0);
+    EXPECT_THAT(changes.keys(), IsEmpty());
+    const char* request[] = {"settings"};
+    EXPECT_EQ(device_remote_send(request, 1), 0);
+    EXPECT_THAT(changes.keys(), ElementsAre(formatKey)) << "before the main loop turns";
+    iterateFor(0.1);
+    EXPECT_THAT(changes.keys(), ElementsAre(formatKey)) << "and not twice";
 }
 
 TEST_F(Vconf, AKeyThatDoesNotExistYetCanBeWatched) {

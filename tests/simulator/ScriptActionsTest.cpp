@@ -76,7 +76,8 @@ public:
     double now() override { return _now; }
 
     std::vector<std::string> rows;
-    int scrolled = 0; ///< Pixels.
+    int scrolled = 0;  ///< Pixels.
+    int faintFrom = 0; ///< Rows from here on have faded; 0 = none have.
     std::vector<MadeUpWheel> wheels;
     bool typing = false;
     std::string moving;
@@ -124,6 +125,7 @@ private:
             for (const int number : {100, y, 100, 30, 100, top, 100, bottom - top})
                 words.push_back(std::to_string(number));
             words.emplace_back("");
+            words.emplace_back(faintFrom > 0 && y >= faintFrom ? "faint" : "");
             words.push_back(rows[i]);
         }
         return words;
@@ -220,6 +222,14 @@ TEST_F(ScriptActions, ScrollingLeavesAloneWhatIsInFullView) {
     device.rows = {"A", "B"};
     EXPECT_EQ(does("scroll-to B"), "");
     EXPECT_EQ(device.downs, 0);
+}
+
+TEST_F(ScriptActions, ScrollingGoesOnUntilARowCanBeRead) {
+    for (int i = 0; i < 10; ++i)
+        device.rows.push_back("Row " + std::to_string(i) + ".");
+    device.faintFrom = 200;
+    EXPECT_EQ(does("scroll-to \"Row 2.\""), "");
+    EXPECT_GT(device.scrolled, 0) << "it was there, but it had faded";
 }
 
 TEST_F(ScriptActions, ScrollingPrefersTheWholeTextToOneThatBeginsSo) {
