@@ -83,8 +83,18 @@ Eina_Bool Foreground::_visibilityCb(void* data, int, void* info) {
     return ECORE_CALLBACK_PASS_ON;
 }
 
+void Foreground::leave(bool away) {
+    _away = away;
+    // Who calls it back looks at it.
+    if (!away) {
+        _leaving.reset();
+        _unfocused = false;
+    }
+    update();
+}
+
 void Foreground::update() {
-    const bool paused = _unfocused || _covered;
+    const bool paused = _unfocused || _covered || _away;
     if (paused == _paused)
         return;
     _paused = paused;

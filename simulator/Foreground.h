@@ -24,6 +24,9 @@ public:
     /** @brief Sets a window that a person may use without leaving the application; null for none.
      */
     void setCompanion(Evas_Object* window);
+    /** @brief Leaves the application, whatever window is in front; or comes back to it. */
+    void leave(bool away);
+    bool isInFront() const { return !_paused; }
     Foreground(const Foreground&) = delete;
     Foreground& operator=(const Foreground&) = delete;
 
@@ -48,6 +51,7 @@ private:
     std::unique_ptr<Ecore_Timer, TimerDeleter> _leaving;
     bool _unfocused = false; ///< It had the focus and lost it.
     bool _covered = false;
+    bool _away = false; ///< It was sent to the background.
     bool _paused = false;
     std::unique_ptr<Ecore_Event_Handler, HandlerDeleter> _visibility;
 };

@@ -10,6 +10,7 @@
 #include "PowerSaving.h"
 #include "VolumeKeys.h"
 #include "clock/ClockEventListener.h"
+#include "control/DeviceActions.h"
 
 #define LOG_TAG "clock-sim"
 #include "base/Log.h"
@@ -35,8 +36,14 @@ constexpr std::array<KeyRow, 7> KEY_ROWS{{
      [](const QuickPanel& quickPanel) {
          quickPanel();
      }},
-    {"F5", "the application goes to the background", raise<ClockEventListener::PAUSED>},
-    {"F6", "the application comes back", raise<ClockEventListener::RESUMED>},
+    {"F5", "the application goes to the background",
+     [](const QuickPanel&) {
+         goToBackground();
+     }},
+    {"F6", "the application comes back",
+     [](const QuickPanel&) {
+         comeToForeground();
+     }},
     {"F7", "the language was changed", raise<ClockEventListener::LANGUAGE_CHANGED>},
     {"F8", "the clock or the time zone was set", raise<ClockEventListener::TIME_CHANGED>},
     {"F9", "a setting was changed", raise<ClockEventListener::SETTINGS_CHANGED>},

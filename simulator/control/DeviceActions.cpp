@@ -4,6 +4,7 @@
 #include <initializer_list>
 #include <vector>
 
+#include "../Foreground.h"
 #include "../QuickPanel.h"
 #include "../WatchFace.h"
 #include "clock/ClockEventListener.h"
@@ -21,14 +22,39 @@ QuickPanel*& quickPanel() {
     return panel;
 }
 
-void send(std::initializer_list<std::string> words) {
+Foreground*& foreground() {
+    static Foreground* current = nullptr;
+    return current;
+}
+
+using Words = std::initializer_list<std::string>;
+
+std::vector<const char*> pointersTo(const Words& words) {
     std::vector<const char*> pointers;
     pointers.reserve(words.size());
     for (const std::string& word : words)
         pointers.push_back(word.c_str());
+    return pointers;
+}
+
+void send(const Words& words) {
+    const auto pointers = pointersTo(words);
     const int result = device_remote_send(pointers.data(), static_cast<int>(pointers.size()));
     if (result < 0)
         LOG_ERROR("The application in front cannot be reached: %s", std::strerror(-result));
+}
+
+void showHome(bool shown) {
+    const Words words{"home", shown ? "on" : "off"};
+    const auto pointers = pointersTo(words);
+    const int result =
+        device_remote_send_to_all(pointers.data(), static_cast<int>(pointers.size()));
+    if (result < 0)
+        LOG_ERROR("An application cannot be reached: %s", std::strerror(-result));
+    if (foreground() != nullptr)
+        foreground()->leave(shown);
+    else
+        ClockEventListener::raise(shown ? ClockEventListener::PAUSED : ClockEventListener::RESUMED);
 }
 
 } // namespace
@@ -66,12 +92,20 @@ void closeQuickPanel() {
         quickPanel()->toggle();
 }
 
+void setForeground(Foreground* current) {
+    foreground() = current;
+}
+
 void goToBackground() {
-    ClockEventListener::raise(ClockEventListener::PAUSED);
+    showHome(true);
 }
 
 void comeToForeground() {
-    ClockEventListener::raise(ClockEventListener::RESUMED);
+    showHome(false);
+}
+
+bool isInForeground() {
+    return foreground() == nullptr || foreground()->isInFront();
 }
 
 } // namespace simulator

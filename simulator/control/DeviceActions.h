@@ -10,6 +10,7 @@
 
 namespace simulator {
 
+class Foreground;
 class QuickPanel;
 
 /** @brief Presses a key and keeps it down. @param name As of an X key, for example "XF86Back". */
@@ -25,9 +26,13 @@ void setQuickPanel(QuickPanel* panel);
 void openQuickPanel();
 void closeQuickPanel();
 
-/** @brief Tells the clock application that nobody looks at it any more. */
+/** @brief Names who tells the clock application whether it is looked at; null when it goes. */
+void setForeground(Foreground* foreground);
+/** @brief Shows the time instead of the applications, and tells the clock that nobody looks. */
 void goToBackground();
-/** @brief Tells it that a person looks at it again. */
+/** @brief Shows the applications again, and tells the clock that a person looks at it. */
 void comeToForeground();
+/** @brief Whether a person looks at the clock application. */
+bool isInForeground();
 
 } // namespace simulator
