@@ -18,7 +18,9 @@
 #include "PickCity.h"
 #include "PowerSaving.h"
 #include "QuickPanel.h"
+#include "QuickPanelMessage.h"
 #include "RemoteControl.h"
+#include "SettingEvents.h"
 #include "ToastView.h"
 #include "VolumeKeys.h"
 #include "VolumeView.h"
@@ -27,7 +29,6 @@
 #include "app_assist/WWindowController.h"
 #include "clock/ClockAlarmDbModel.h"
 #include "clock/ClockAlarmManagerModel.h"
-#include "clock/ClockEventListener.h"
 #include "control/ControlPanel.h"
 #include "control/DeviceActions.h"
 #include "control/DeviceSettings.h"
@@ -36,15 +37,11 @@
 #include "device/vconf.h"
 #include "device_app.h"
 #include "device_host.h"
+#include "device_settings.h"
 
 namespace simulator {
 namespace {
 
-constexpr const char* TIME_FORM_KEY = "db/menu_widget/regionformat_time1224";
-constexpr const char* REGION_KEY = "db/menu_widget/regionformat";
-constexpr const char* LANGUAGE_KEY = "db/setting/language";
-constexpr const char* TIME_ZONE_KEY = "db/setting/time_zone";
-constexpr const char* CLOCK_SHIFT_KEY = "db/setting/clock_shift";
 constexpr int TWELVE_HOURS = 1;
 constexpr int TWENTY_FOUR_HOURS = 2;
 
@@ -94,13 +91,13 @@ public:
 private:
     static bool setTimeForm(bool twelveHour) {
         const int form = twelveHour ? TWELVE_HOURS : TWENTY_FOUR_HOURS;
-        return vconf_set_int(TIME_FORM_KEY, form) == VCONF_OK;
+        return vconf_set_int(DEVICE_SETTING_TIME_FORM, form) == VCONF_OK;
     }
     /** A watch leaves the factory with a region; screens do not follow the hours without one. */
     static void setMissingRegion() {
-        char* region = vconf_get_str(REGION_KEY);
+        char* region = vconf_get_str(DEVICE_SETTING_REGION);
         if (region == nullptr)
-            vconf_set_str(REGION_KEY, "en_US.UTF-8");
+            vconf_set_str(DEVICE_SETTING_REGION, "en_US.UTF-8");
         std::free(region);
     }
     static std::string writeSettings(const Options& options) {
@@ -157,18 +154,6 @@ bool isStored(int id) {
                        [id](const ClockAlarmDbData& alarm) { return alarm.id == id; });
 }
 
-void settingChangedCb(keynode_t*, void*) {
-    ClockEventListener::raise(ClockEventListener::SETTINGS_CHANGED);
-}
-
-void languageChangedCb(keynode_t*, void*) {
-    ClockEventListener::raise(ClockEventListener::LANGUAGE_CHANGED);
-}
-
-void timeChangedCb(keynode_t*, void*) {
-    ClockEventListener::raise(ClockEventListener::TIME_CHANGED);
-}
-
 void closedCb(void*, Evas_Object*, void*) {
     elm_exit();
 }
@@ -182,33 +167,23 @@ ControlActions controlActions(QuickPanel& quickPanel) {
             }};
 }
 
-/** Tells a window about the quick panel, as the system's own window does. */
-void sendQuickPanelState(Evas_Object* window, bool shown) {
-    const Ecore_X_Window xWindow = elm_win_xwindow_get(window);
-    if (xWindow == 0)
-        return;
-    ecore_x_client_message32_send(xWindow, ECORE_X_ATOM_E_ILLUME_QUICKPANEL_STATE,
-                                  ECORE_X_EVENT_MASK_NONE,
-                                  static_cast<long>(shown ? ECORE_X_ATOM_E_ILLUME_QUICKPANEL_ON
-                                                          : ECORE_X_ATOM_E_ILLUME_QUICKPANEL_OFF),
-                                  0, 0, 0, 0);
-}
-
 /** What the system draws over the application and does with keys that nobody has taken. */
 class System {
 public:
     System(Evas_Object* window, const std::string& theme, std::optional<bool> controls)
         : _toasts(window, theme), _volume(window, theme),
-          _panel(window, theme, [window](bool shown) { sendQuickPanelState(window, shown); }),
+          _panel(window, theme, [window](bool shown) { sendQuickPanelMessage(window, shown); }),
           _keys([this] { _panel.toggle(); }), _volumeKeys([this](int level) { showVolume(level); }),
           _foreground(window) {
         addBezel(window);
         setQuickPanel(&_panel);
+        setForeground(&_foreground);
         if (controls.value_or(hasRoomForPanel(window)))
             openControls(window, theme);
     }
     ~System() {
         closeControls();
+        setForeground(nullptr);
         setQuickPanel(nullptr);
     }
     System(const System&) = delete;
@@ -329,12 +304,8 @@ int runWatch(const Options& options) {
     if (!device.startToolkit())
         return fail("the toolkit cannot be started with the device's theme");
     elm_theme_extension_add(nullptr, theme.c_str());
-    vconf_notify_key_changed(TIME_FORM_KEY, settingChangedCb, nullptr);
-    vconf_notify_key_changed(REGION_KEY, settingChangedCb, nullptr);
-    // The device follows it before it tells this.
-    vconf_notify_key_changed(LANGUAGE_KEY, languageChangedCb, nullptr);
-    vconf_notify_key_changed(TIME_ZONE_KEY, timeChangedCb, nullptr);
-    vconf_notify_key_changed(CLOCK_SHIFT_KEY, timeChangedCb, nullptr);
+    followSettings();
+    prepareQuickPanelMessage();
     if (options.pickCity)
         showCityPicker(options, theme);
     else
