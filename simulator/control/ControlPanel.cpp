@@ -80,7 +80,7 @@ ControlPanel::ControlPanel(Evas_Object* face, const std::string& theme,
 
     device_host_set_log_callback(_logCb, _lines.get());
     evas_object_smart_callback_add(window, "delete,request", _deleteRequestCb, this);
-    evas_object_event_callback_add(window, EVAS_CALLBACK_KEY_DOWN, _keyDownCb, this);
+    evas_object_event_callback_add(layout, EVAS_CALLBACK_KEY_DOWN, _keyDownCb, window);
     evas_object_event_callback_add(layout, EVAS_CALLBACK_MOUSE_DOWN, _mouseDownCb, window);
     _buttonDown.reset(ecore_event_handler_add(ECORE_EVENT_MOUSE_BUTTON_DOWN, _buttonDownCb, this));
     _refresh.reset(ecore_timer_add(REFRESH_SECONDS, _refreshCb, this));
@@ -115,10 +115,10 @@ void ControlPanel::_closedCb(void* data) {
     closed();
 }
 
-void ControlPanel::_keyDownCb(void*, Evas*, Evas_Object* window, void* info) {
+void ControlPanel::_keyDownCb(void* data, Evas*, Evas_Object*, void* info) {
     // Who walks with keys sees where; who points knows.
     if (std::strstr(static_cast<Evas_Event_Key_Down*>(info)->key, "Tab") != nullptr)
-        elm_win_focus_highlight_enabled_set(window, EINA_TRUE);
+        elm_win_focus_highlight_enabled_set(static_cast<Evas_Object*>(data), EINA_TRUE);
 }
 
 void ControlPanel::_mouseDownCb(void* data, Evas*, Evas_Object*, void*) {

@@ -60,8 +60,8 @@ private:
     static Eina_Bool _refreshCb(void* data);
     static void _deleteRequestCb(void* data, Evas_Object* window, void* info);
     static void _closedCb(void* data);
-    static void _keyDownCb(void* data, Evas* canvas, Evas_Object* window, void* info);
-    static void _mouseDownCb(void* data, Evas* canvas, Evas_Object* window, void* info);
+    static void _keyDownCb(void* data, Evas* canvas, Evas_Object* layout, void* info);
+    static void _mouseDownCb(void* data, Evas* canvas, Evas_Object* layout, void* info);
     static Eina_Bool _buttonDownCb(void* data, int type, void* info);
     static void _logCb(int priority, const char* tag, const char* text, void* data);
 

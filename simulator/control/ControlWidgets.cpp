@@ -148,17 +148,17 @@ Evas_Object* addButton(Evas_Object* row, const char* label, const std::string& n
     return button;
 }
 
-Evas_Object* addSwitch(Evas_Object* row, const char* label, const std::string& name) {
+Evas_Object* addSwitch(Evas_Object* row, const char* label, const std::string& name, int width) {
     Evas_Object* check = elm_check_add(row);
     prepare(check, name);
     elm_object_style_set(check, PLAIN);
     elm_object_text_set(check, label);
-    place(row, check);
+    place(row, check, width);
     return check;
 }
 
 Evas_Object* addRadio(Evas_Object* row, const char* label, const std::string& name,
-                      Evas_Object* group, int value) {
+                      Evas_Object* group, int value, int width) {
     Evas_Object* radio = elm_radio_add(row);
     prepare(radio, name);
     elm_object_style_set(radio, PLAIN);
@@ -166,7 +166,7 @@ Evas_Object* addRadio(Evas_Object* row, const char* label, const std::string& na
     elm_radio_state_value_set(radio, value);
     if (group != nullptr)
         elm_radio_group_add(radio, group);
-    place(row, radio);
+    place(row, radio, width);
     return radio;
 }
 
@@ -177,8 +177,16 @@ Eina_Bool selectAllCb(void* field, Evas*) {
     return EINA_TRUE;
 }
 
+/** The toolkit takes a click soon after any other one for the half of a double click alone. */
+void enterCb(void*, Evas*, Evas_Object* field, void* info) {
+    if (static_cast<Evas_Event_Mouse_Up*>(info)->flags != EVAS_BUTTON_NONE &&
+        elm_object_focus_get(field) == EINA_FALSE)
+        elm_object_focus_set(field, EINA_TRUE);
+}
+
 /** What is typed first replaces what a field shows. */
 void selectWhenEntered(Evas_Object* field) {
+    evas_object_event_callback_add(field, EVAS_CALLBACK_MOUSE_UP, enterCb, nullptr);
     onEvent(field, "focused", [field] {
         evas_object_data_set(field, ENTERED, field);
         elm_entry_select_all(field);

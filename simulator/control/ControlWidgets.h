@@ -46,10 +46,10 @@ inline constexpr const char* SET = "control.set";
 
 Evas_Object* addButton(Evas_Object* row, const char* label, const std::string& name,
                        const char* look = PLAIN, int width = 0);
-Evas_Object* addSwitch(Evas_Object* row, const char* label, const std::string& name);
+Evas_Object* addSwitch(Evas_Object* row, const char* label, const std::string& name, int width = 0);
 /** @param group The first radio of the same choice, or null. */
 Evas_Object* addRadio(Evas_Object* row, const char* label, const std::string& name,
-                      Evas_Object* group, int value);
+                      Evas_Object* group, int value, int width = 0);
 Evas_Object* addField(Evas_Object* row, const char* hint, const std::string& name);
 
 /** @brief The text of a field, as it was typed. */

@@ -1,5 +1,6 @@
 #include "SettingsSection.h"
 
+#include <array>
 #include <cmath>
 #include <cstdlib>
 
@@ -13,6 +14,9 @@ namespace simulator::control {
 namespace {
 
 constexpr int COLUMNS = 4;
+/** The longest name stands in the third column. */
+constexpr std::array<int, COLUMNS> COLUMN_WIDTHS{0, 0, 112, 0};
+constexpr int POWER_SAVING_WIDTH = 104;
 constexpr int NONE = -1;
 constexpr int NUMBER_WIDTH = 22;
 constexpr double LOUDEST = 15;
@@ -35,7 +39,7 @@ SettingsSection::SettingsSection(Evas_Object* column, const Tell& tell) {
     addLanguages(content, tell);
     Evas_Object* row = addRow(content);
     addTimeForm(row, tell);
-    addOnOff(row, "Power saving", "power-saving", tell);
+    addOnOff(row, "Power saving", "power-saving", tell, POWER_SAVING_WIDTH);
     addOnOff(row, "Motion", "motion", tell);
     row = addRow(content);
     addText(row, "Region", "de_DE", "region", tell);
@@ -57,7 +61,7 @@ void SettingsSection::addLanguages(Evas_Object* content, const Tell& tell) {
             row = addRow(content);
         const Language& language = LANGUAGES.at(i);
         Evas_Object* radio = addRadio(row, language.name, std::string("Language ") + language.name,
-                                      group, static_cast<int>(i));
+                                      group, static_cast<int>(i), COLUMN_WIDTHS.at(i % COLUMNS));
         onEvent(radio, "changed",
                 [tell, &language] { tell(setDevice("language", language.code)); });
         if (group == nullptr)
@@ -65,7 +69,7 @@ void SettingsSection::addLanguages(Evas_Object* content, const Tell& tell) {
     }
     // The last row is as wide as the others.
     for (std::size_t i = LANGUAGES.size(); i % COLUMNS != 0; ++i)
-        place(row, elm_box_add(row));
+        place(row, elm_box_add(row), COLUMN_WIDTHS.at(i % COLUMNS));
     _refreshes.emplace_back([group] { showChoice(group, languageIndex()); });
 }
 
@@ -83,8 +87,8 @@ void SettingsSection::addTimeForm(Evas_Object* row, const Tell& tell) {
 }
 
 void SettingsSection::addOnOff(Evas_Object* row, const char* label, const char* setting,
-                               const Tell& tell) {
-    Evas_Object* check = addSwitch(row, label, label);
+                               const Tell& tell, int width) {
+    Evas_Object* check = addSwitch(row, label, label, width);
     onEvent(check, "changed", [tell, check, setting] {
         tell(setDevice(setting, elm_check_state_get(check) != EINA_FALSE ? "on" : "off"));
     });

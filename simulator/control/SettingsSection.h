@@ -28,7 +28,8 @@ public:
 private:
     void addLanguages(Evas_Object* content, const Tell& tell);
     void addTimeForm(Evas_Object* row, const Tell& tell);
-    void addOnOff(Evas_Object* row, const char* label, const char* setting, const Tell& tell);
+    void addOnOff(Evas_Object* row, const char* label, const char* setting, const Tell& tell,
+                  int width = 0);
     void addVolume(Evas_Object* content, const Tell& tell);
     void addText(Evas_Object* row, const char* caption, const char* hint, const char* setting,
                  const Tell& tell);

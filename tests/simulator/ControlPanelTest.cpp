@@ -2,6 +2,7 @@
 
 #include "control/ControlPanel.h"
 
+#include <cstdlib>
 #include <memory>
 #include <optional>
 #include <set>
@@ -9,6 +10,7 @@
 #include <vector>
 
 #include <Ecore_Evas.h>
+#include <Ecore_Input.h>
 #include <gmock/gmock.h>
 
 #include "PanelHand.h"
@@ -168,6 +170,77 @@ TEST_F(ControlPanelTest, regionAndNetworkAreTyped) {
     EXPECT_EQ(setting("memory/telephony/plmn"), "26201");
 }
 
+TEST_F(ControlPanelTest, aClickSoonAfterAnotherOneEntersAFieldToo) {
+    hand->type("Region", "ko_KR");
+    hand->key("Return", "\n");
+    hand->click("Motion");
+    for (const auto flags : {EVAS_BUTTON_DOUBLE_CLICK, EVAS_BUTTON_TRIPLE_CLICK}) {
+        hand->click("Motion");
+        hand->clickSoon("Region", flags);
+        EXPECT_EQ(hand->focused(), "Region");
+        hand->write(flags == EVAS_BUTTON_DOUBLE_CLICK ? "de_DE" : "tr_TR");
+        hand->key("Return", "\n");
+    }
+    EXPECT_EQ(setting("db/menu_widget/regionformat"), "tr_TR");
+    EXPECT_EQ(device().callsTo("vconf_set_str").size(), 3U) << "what was there was not replaced";
+}
+
+TEST_F(ControlPanelTest, buttonsMayBeClickedQuickly) {
+    hand->click("One hour on");
+    hand->clickSoon("One hour on");
+    hand->clickSoon("One hour on", EVAS_BUTTON_TRIPLE_CLICK);
+    EXPECT_EQ(number("db/setting/clock_shift"), 3 * 3600);
+    hand->click("Power saving");
+    hand->clickSoon("Power saving");
+    EXPECT_EQ(number("db/setting/psmode"), 0);
+    hand->clickSoon("12 hours");
+    EXPECT_EQ(number("db/menu_widget/regionformat_time1224"), 1);
+    hand->clickSoon("Raise volume key");
+    hand->clickSoon("Raise volume key", EVAS_BUTTON_TRIPLE_CLICK);
+    EXPECT_THAT(done, ElementsAre("XF86AudioRaiseVolume down", "XF86AudioRaiseVolume up",
+                                  "XF86AudioRaiseVolume down", "XF86AudioRaiseVolume up"));
+}
+
+TEST_F(ControlPanelTest, allChoicesAreWrittenEquallyLarge) {
+    std::set<int> sizes;
+    std::vector<std::pair<std::string, std::string>> chips;
+    for (const auto& language : simulator::LANGUAGES)
+        chips.emplace_back(std::string("Language ") + language.name, language.name);
+    for (const char* other : {"12 hours", "24 hours", "Power saving", "Motion"})
+        chips.emplace_back(other, other);
+    for (const auto& [name, label] : chips) {
+        const Evas_Object* text =
+            edje_object_part_object_get(elm_layout_edje_get(hand->widget(name)), "elm.text");
+        int size = 0;
+        evas_object_text_font_get(text, nullptr, &size);
+        sizes.insert(size);
+        EXPECT_EQ(evas_object_text_text_get(text), label) << "it is cut";
+    }
+    EXPECT_EQ(sizes.size(), 1U) << testing::PrintToString(sizes);
+}
+
+TEST_F(ControlPanelTest, midnightAndTheChangeOfTheZonesClocksAreOnePressEach) {
+    hand->click("Before midnight");
+    int shift = number("db/setting/clock_shift");
+    VirtualClock::jump(shift);
+    Stage::advance(0.5);
+    EXPECT_THAT(hand->part("Readout", "readout.time"), testing::StartsWith("23:59:5"));
+    EXPECT_EQ(hand->part("Readout", "readout.date"), "Wed 18 November 2026");
+    VirtualClock::jump(-shift);
+    hand->type("Time zone", "new york");
+    hand->key("Return", "\n");
+    VirtualClock::setZone("America/New_York");
+    hand->click("Before the daylight-saving change");
+    shift = number("db/setting/clock_shift");
+    VirtualClock::jump(shift);
+    Stage::advance(0.5);
+    EXPECT_THAT(hand->part("Readout", "readout.time"), testing::StartsWith("01:59:5"));
+    EXPECT_EQ(hand->part("Readout", "readout.date"), "Sun 14 March 2027");
+    Stage::advance(10);
+    EXPECT_THAT(hand->part("Readout", "readout.time"), testing::StartsWith("03:00:0"));
+    EXPECT_EQ(hand->part("Readout", "readout.zone"), "America/New_York · UTC−4:00");
+}
+
 TEST_F(ControlPanelTest, aRefusedValueIsExplainedForAMomentAndTheOldOneComesBack) {
     hand->type("Region", "Germany");
     hand->key("Return", "\n");
@@ -220,6 +293,21 @@ TEST_F(ControlPanelTest, aTimeZoneIsChosenFromThoseThatFit) {
     EXPECT_EQ(setting("db/setting/time_zone"), "America/New_York");
     Stage::advance(0.5);
     EXPECT_STREQ(elm_entry_entry_get(hand->widget("Time zone")), "America/New_York");
+}
+
+TEST_F(ControlPanelTest, aChosenZoneMakesRoomForTheNextOne) {
+    hand->type("Time zone", "tokyo");
+    hand->click("Asia/Tokyo");
+    device().setSetting("db/setting/time_zone", std::string("Asia/Seoul"));
+    Stage::advance(0.5);
+    EXPECT_STREQ(elm_entry_entry_get(hand->widget("Time zone")), "Asia/Seoul")
+        << "what was chosen counts as being typed";
+    hand->type("Time zone", "berlin");
+    hand->key("Return", "\n");
+    Stage::advance(0.5);
+    hand->write("honol");
+    hand->key("Return", "\n");
+    EXPECT_EQ(setting("db/setting/time_zone"), "Pacific/Honolulu");
 }
 
 TEST_F(ControlPanelTest, theListOfZonesGoesWithTheField) {
@@ -368,10 +456,18 @@ TEST_F(ControlPanelTest, aHapticTapFlashesAtTheRim) {
     const unsigned before = rim();
     ASSERT_NE(listeners().haptic, nullptr);
     listeners().haptic(0, listeners().hapticData);
+    const auto lamp = [this] {
+        double value = 0;
+        const char* state = edje_object_part_state_get(elm_layout_edje_get(hand->widget("Readout")),
+                                                       "pulse", &value);
+        return std::string(state == nullptr ? "" : state);
+    };
     Stage::frames(4);
     EXPECT_GT(rim(), before + 60);
+    EXPECT_EQ(lamp(), "on");
     Stage::advance(1);
     EXPECT_EQ(rim(), before);
+    EXPECT_EQ(lamp(), "default");
 }
 
 TEST_F(ControlPanelTest, aPersonCanCloseIt) {
@@ -423,6 +519,27 @@ TEST_F(ControlPanelTest, everyControlIsReachedWithTabAndHasAName) {
         ASSERT_NE(hand->widget(name), nullptr) << name;
         EXPECT_EQ(simulator::control::accessibleName(hand->widget(name)), name);
     }
+}
+
+TEST_F(ControlPanelTest, whoWalksWithKeysSeesWhereAndWhoPointsDoesNot) {
+    elm_object_focus_set(hand->widget("Back key"), EINA_TRUE);
+    Stage::frames(3);
+    hand->key("Tab");
+    EXPECT_TRUE(elm_win_focus_highlight_enabled_get(panel->window()));
+    hand->click("Motion");
+    EXPECT_FALSE(elm_win_focus_highlight_enabled_get(panel->window()));
+}
+
+TEST_F(ControlPanelTest, aClickBringsTheKeysWhereNoWindowManagerDoes) {
+    Ecore_Evas* ee = ecore_evas_ecore_evas_get(evas_object_evas_get(panel->window()));
+    ecore_evas_focus_set(ee, EINA_FALSE);
+    Stage::frames(2);
+    auto* event =
+        static_cast<Ecore_Event_Mouse_Button*>(calloc(1, sizeof(Ecore_Event_Mouse_Button)));
+    event->window = event->event_window = ecore_evas_window_get(ee);
+    ecore_event_add(ECORE_EVENT_MOUSE_BUTTON_DOWN, event, nullptr, nullptr);
+    Stage::frames(2);
+    EXPECT_TRUE(ecore_evas_focus_get(ee));
 }
 
 TEST_F(ControlPanelTest, itStandsTheSameWayInALanguageThatRunsToTheLeft) {
