@@ -108,6 +108,113 @@ check "The tone picker looks unlike the list" bash -c '! cmp -s tones.png list.p
 check "The recording is an animated picture" is "$(head -c 16 day.webp | tail -c 8)" WEBPVP8X
 check "It has many pictures" test "$(frames_of day.webp)" -gt 30
 
+# What is open follows the clock and the zone.
+check "An open editor follows the clock, midnight and the zone" scripted 0 <<'SCRIPT'
+set time-zone Europe/Berlin
+set clock "2026-11-18 09:41"
+tap Create
+time 06:05
+expect "Tomorrow - Thu, Nov 19"
+set clock before-midnight
+expect "Tomorrow - Thu, Nov 19"
+wait "Today - Thu, Nov 19" 13
+set clock "2026-11-25 05:00"
+expect "Today - Wed, Nov 25"
+set time-zone Asia/Tokyo
+expect "Tomorrow - Thu, Nov 26"
+SCRIPT
+check "The world clock does, too" scripted 0 <<'SCRIPT'
+set time-zone Europe/Berlin
+set clock "2026-11-18 09:41"
+tap "World clock"
+expect 14:26
+set clock before-midnight
+expect 04:44
+wait 04:45 13
+set time-zone Asia/Tokyo
+expect 04:45
+set clock real
+SCRIPT
+
+# The language of a run ends with a choice.
+check "A language is stored" scripted 0 <<<'set language de'
+printf 'expect Create\nset language de\nexpect Erstellen\nexpect-setting language de\n' >"$work/german.script"
+check "Another one is spoken for a run, until that is chosen" runs 0 --data "$data" --24h --language en --script "$work/german.script"
+check "English is stored again" scripted 0 <<<'set language en'
+
+# Motion, in applications that run already.
+check "Motion is switched off and on again while applications run" scripted 0 <<'SCRIPT'
+tap Create
+wait idle
+record start moves.webp 30
+key XF86Back
+wait idle
+record stop
+tap Create
+set motion off
+wait idle
+record start jumps.webp 30
+key XF86Back
+wait idle
+record stop
+set motion on
+tap Create
+scroll-to "Alarm tone"
+tap "Alarm tone"
+wait Marimba
+bezel 1
+wait idle
+record start tones-move.webp 30
+bezel 1
+wait idle
+record stop
+set motion off
+wait idle
+record start tones-jump.webp 30
+bezel -1
+wait idle
+record stop
+set motion on
+wait idle
+record start tones-again.webp 30
+bezel 1
+wait idle
+record stop
+SCRIPT
+check "Pages moved" test "$(frames_of moves.webp)" -gt "$(($(frames_of jumps.webp) + 2))"
+check "Pages jumped" test "$(frames_of jumps.webp)" -le 3
+check "The tone picker moved" test "$(frames_of tones-move.webp)" -gt 4
+check "It jumped while motion was off" test "$(frames_of tones-jump.webp)" -le 3
+check "It moved again" test "$(frames_of tones-again.webp)" -gt 4
+
+# Nobody looks at the applications.
+check "The time is shown instead of the applications" scripted 0 <<'SCRIPT'
+set time-zone Europe/Berlin
+set clock "2026-11-18 09:41"
+tap Create
+background
+expect 09:41
+expect-not Done
+screenshot away.png
+key XF86Back
+foreground
+expect Done
+expect-not 09:41
+scroll-to "Alarm tone"
+tap "Alarm tone"
+wait Marimba
+background
+expect 09:41
+expect-not Marimba
+key XF86Back
+foreground
+expect Marimba
+key XF86Back
+expect "Alarm tone"
+set clock real
+SCRIPT
+check "The picture of it is there" is_png away.png
+
 # Scripts that fail.
 check "A text that is not there ends a script" scripted 1 <<'SCRIPT'
 tap Create
