@@ -33,7 +33,14 @@ bool isMark(const FocusThing& thing) {
     return name == "Elm_Check" || name == "Elm_Radio";
 }
 
-/** A switch or a mark does what its row does, unless the row's theme tells otherwise. */
+FocusBox viewOf(const Evas_Object* list) {
+    FocusBox view = boxOf(list);
+    elm_scroller_region_get(list, nullptr, nullptr, &view.width, &view.height);
+    return view;
+}
+
+} // namespace
+
 bool actsForItself(const Evas_Object* mark) {
     for (const Evas_Object* o = evas_object_smart_parent_get(mark); o;
          o = evas_object_smart_parent_get(o)) {
@@ -43,14 +50,6 @@ bool actsForItself(const Evas_Object* mark) {
     }
     return false;
 }
-
-FocusBox viewOf(const Evas_Object* list) {
-    FocusBox view = boxOf(list);
-    elm_scroller_region_get(list, nullptr, nullptr, &view.width, &view.height);
-    return view;
-}
-
-} // namespace
 
 bool canPressRow(const Elm_Object_Item* item) {
     const Elm_Object_Select_Mode mode = elm_genlist_item_select_mode_get(item);

@@ -38,6 +38,9 @@ private:
     Evas_Object* _list;
 };
 
+/** @brief False for a switch or a mark that does what its row does; the row's theme tells. */
+bool actsForItself(const Evas_Object* mark);
+
 /** @brief True for a row that does something when it is tapped. */
 bool canPressRow(const Elm_Object_Item* item);
 

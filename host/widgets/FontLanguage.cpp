@@ -25,8 +25,8 @@
 namespace {
 
 constexpr std::string_view FONT_ATTRIBUTE = ":lang=";
-constexpr std::string_view STYLE_ATTRIBUTE = " lang=";
-constexpr std::string_view STYLE_START = "DEFAULT='";
+constexpr std::string_view BLOCK_ATTRIBUTE = " lang=";
+constexpr std::string_view BLOCK_START = "DEFAULT='";
 
 /** As fontconfig writes it; empty where fonts need not know. */
 std::string& language() {
@@ -70,10 +70,10 @@ std::string fontWithLanguage(const std::string& font) {
 
 /** Where the first format of a style ends; npos when it has none. */
 std::size_t endOfDefault(const std::string& style) {
-    const auto start = style.find(STYLE_START);
+    const auto start = style.find(BLOCK_START);
     if (start == std::string::npos)
         return start;
-    std::size_t end = start + STYLE_START.size();
+    std::size_t end = start + BLOCK_START.size();
     while (end < style.size() && style[end] != '\'')
         end += style[end] == '\\' ? 2 : 1;
     return end < style.size() ? end : std::string::npos;
@@ -81,7 +81,7 @@ std::size_t endOfDefault(const std::string& style) {
 
 std::string plainStyle(std::string style) {
     const auto end = endOfDefault(style);
-    const auto from = end == std::string::npos ? end : style.rfind(STYLE_ATTRIBUTE, end);
+    const auto from = end == std::string::npos ? end : style.rfind(BLOCK_ATTRIBUTE, end);
     if (from != std::string::npos)
         style.erase(from, end - from);
     return style;
@@ -90,8 +90,8 @@ std::string plainStyle(std::string style) {
 std::string styleWithLanguage(std::string style) {
     const auto end = endOfDefault(style);
     if (end != std::string::npos && !language().empty() &&
-        style.rfind(STYLE_ATTRIBUTE, end) == std::string::npos)
-        style.insert(end, std::string(STYLE_ATTRIBUTE) + language());
+        style.rfind(BLOCK_ATTRIBUTE, end) == std::string::npos)
+        style.insert(end, std::string(BLOCK_ATTRIBUTE) + language());
     return style;
 }
 

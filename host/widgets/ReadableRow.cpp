@@ -98,6 +98,8 @@ Efl_Access_Role roleOf(const Eo* row, void*) {
 bool isMarked(const Elm_Object_Item* row) {
     for (const Evas_Object* control : host::controlsOfRow(row)) {
         const std::string_view type = elm_object_widget_type_get(control);
+        if (host::actsForItself(control))
+            continue;
         if (type == "Elm_Check" || type == "Elm_Radio")
             return STATE_TYPE_GET(efl_access_object_state_set_get(control),
                                   EFL_ACCESS_STATE_TYPE_CHECKED);

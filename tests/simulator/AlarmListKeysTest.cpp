@@ -140,10 +140,10 @@ TEST_F(AlarmListKeysTest, everythingHasANameForScreenReaders) {
     add(10, 30, true, WEDNESDAY, "Tea");
     openPage();
     stage().settle();
-    EXPECT_THAT(read(EFL_ACCESS_ROLE_CHECK_BOX), Contains("10:30, in 49 min, Tea\nWed (on)"));
-    EXPECT_THAT(read(EFL_ACCESS_ROLE_LIST_ITEM), Contains("10:30, in 49 min, Tea\nWed"));
+    EXPECT_THAT(read(EFL_ACCESS_ROLE_CHECK_BOX), Contains("10:30, in 49 min, Tea, Wed (on)"));
+    EXPECT_THAT(read(EFL_ACCESS_ROLE_LIST_ITEM), Contains("10:30, in 49 min, Tea, Wed"));
     flip("10:30");
-    EXPECT_THAT(read(EFL_ACCESS_ROLE_CHECK_BOX), Contains("10:30, Tea\nWed"));
+    EXPECT_THAT(read(EFL_ACCESS_ROLE_CHECK_BOX), Contains("10:30, Tea, Wed"));
     takeStageDown();
     elm_config_atspi_mode_set(EINA_FALSE);
 }

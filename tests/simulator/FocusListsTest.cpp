@@ -52,7 +52,8 @@ protected:
         alarm.hour = 7;
         alarm.min = 30;
         alarm.name = "Gym";
-        alarm.enable = 1;
+        // An alarm that rings next would begin with the time until then.
+        alarm.enable = 0;
         alarm.repeatWeekly = 2;
         alarm.repeatOnce = 0;
         alarm.id = ClockAlarmDbModel().reserveAlarmId();

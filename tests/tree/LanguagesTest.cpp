@@ -30,7 +30,7 @@ constexpr std::array HEADER_FIELDS = {
 
 /** Words that a language shares with English. */
 const std::map<std::string, std::vector<std::string>> SHARED = {
-    {"de", {"IDS_ALM_BODY_ALERTTYEP_VIBRATION"}},
+    {"de", {"IDS_ALM_BODY_ALERTTYEP_VIBRATION", "IDS_ALM_BODY_IN_PS"}},
     {"fr", {"IDS_COM_BODY_DATE", "IDS_ALM_BODY_TYPE"}},
     {"pl", {"IDS_COM_BODY_ALARM"}},
     {"tr", {"IDS_COM_BODY_ALARM"}},

@@ -212,7 +212,8 @@ std::set<std::string> offeredNames(const std::string& theme) {
 std::vector<std::string> unused(const fs::path& root) {
     static const std::regex quoted(R"re("([^"\n]+)")re");
     // The toolkit writes the first, the others are for their own group alone.
-    static const std::set<std::string> own{"month_text", "title.full", "bar", "volume.track"};
+    static const std::set<std::string> own{"month_text", "title.full", "text.full", "bar",
+                                           "volume.track"};
     std::set<std::string> used = own;
     for (const auto& text : widgetCode(root))
         used.merge(matches(text, quoted, 1));
