@@ -12,6 +12,7 @@
 #include <Elementary.h>
 
 #include "Accessible.h"
+#include "EvasLists.h"
 #include "ReadableRow.h"
 #include "RowRim.h"
 #include "ThemeNames.h"
@@ -317,9 +318,21 @@ void drawAnew(const Evas_Object* list) {
     });
 }
 
+/** Texts of several lines begin where the first letter's script does, unless they are told. */
+void beginWhereRowsDo(const Evas_Object* row, Evas_BiDi_Direction direction) {
+    for (Evas_Object* member : host::membersOf(row))
+        if (std::string_view(evas_object_type_get(member)) == "textblock")
+            evas_object_paragraph_direction_set(member, direction);
+}
+
 /** Also when a row is filled anew, with what it was drawn in before. */
 void rowRealized(void*, Evas_Object* list, void*) {
-    eachRow(list, adopt);
+    const Evas_BiDi_Direction direction =
+        elm_object_mirrored_get(list) ? EVAS_BIDI_DIRECTION_RTL : EVAS_BIDI_DIRECTION_INHERIT;
+    eachRow(list, [direction](Evas_Object* row) {
+        beginWhereRowsDo(row, direction);
+        adopt(row);
+    });
     drawAnew(list);
     // A list that was turned round has forgotten how soft it was.
     soften(list);
