@@ -6,6 +6,8 @@
 
 #include <Ecore_Evas.h>
 
+#include <gtest/gtest.h>
+
 #include "app_assist/WContentViewController.h"
 #include "simulator/WatchFace.h"
 #include "support/VirtualClock.h"
@@ -67,6 +69,11 @@ void Stage::push(app_assist::WContentViewController* page) {
 void Stage::takeDown() {
     if (!_window) {
         return;
+    }
+    if (Evas_Object* face = window()) {
+        const Area size = area(face);
+        EXPECT_TRUE(size.width == SIZE && size.height == SIZE)
+            << "what was shown has made the window " << size.width << " x " << size.height;
     }
     _naviframe = nullptr;
     _window.reset();
