@@ -1,6 +1,9 @@
 #include "EditField.h"
 
+#include <string_view>
+
 #include "Accessible.h"
+#include "EvasLists.h"
 #include "ThemeNames.h"
 
 #define LOG_TAG "device-host"
@@ -50,6 +53,23 @@ void fieldDeleted(void* data, Evas*, Evas_Object* field, void*) {
     evas_object_data_del(field, ENTRY_KEY);
 }
 
+void turnGuideIn(Evas_Object* object, Evas_BiDi_Direction direction) {
+    const bool isEdje = std::string_view(evas_object_type_get(object)) == "edje";
+    const Evas_Object* guide =
+        isEdje ? edje_object_part_object_get(object, theme::PART_GUIDE) : nullptr;
+    for (Evas_Object* member : membersOf(object)) {
+        if (member == guide)
+            evas_object_paragraph_direction_set(member, direction);
+        turnGuideIn(member, direction);
+    }
+}
+
+/** A guide may begin with a symbol of the device's font, which would have it begin at the left. */
+void turnGuide(void*, Evas_Object* entry, void*) {
+    turnGuideIn(entry, elm_object_mirrored_get(entry) ? EVAS_BIDI_DIRECTION_RTL
+                                                      : EVAS_BIDI_DIRECTION_INHERIT);
+}
+
 /** Focuses first: who empties a field types on, and screens take the change for a person's. */
 void clearClicked(void* field, Evas_Object*, void*) {
     Evas_Object* entry = entryOfField(static_cast<Evas_Object*>(field));
@@ -76,6 +96,8 @@ void addEntryOf(Evas_Object* field) {
         evas_object_smart_callback_add(entry, event, textChanged, field);
     evas_object_smart_callback_add(entry, "focused", entryFocused, field);
     evas_object_smart_callback_add(entry, "unfocused", entryUnfocused, field);
+    turnGuide(nullptr, entry, nullptr);
+    evas_object_smart_callback_add(entry, "language,changed", turnGuide, nullptr);
     evas_object_event_callback_add(field, EVAS_CALLBACK_DEL, fieldDeleted, entry);
 }
 

@@ -56,6 +56,8 @@ inline constexpr int MESSAGE_INDENT = 1;
 
 /** Where a list has its rows. */
 inline constexpr const char* PART_LIST_ROWS = "elm.swallow.content";
+/** Of an entry: what it says while it is empty. */
+inline constexpr const char* PART_GUIDE = "elm.guide";
 /** Names the parts of a row that must not be cut by the rim, in the theme's data. */
 inline constexpr const char* DATA_RIM = "rim";
 /** In the theme's data of a row: its switch does something else than the row. */

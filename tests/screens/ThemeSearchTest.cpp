@@ -12,6 +12,7 @@
 #include <device/ea.h>
 #include <device/uxt.h>
 
+#include "support/FaceInk.h"
 #include "support/ScreenTest.h"
 
 using testing::Contains;
@@ -221,6 +222,27 @@ TEST_F(SearchPageTest, LabelsFollowTheOtherRimOnAMirroredFace) {
     }
     EXPECT_LT(Stage::area(location).x, Stage::area(field).x);
     takeStageDown();
+    elm_config_mirrored_set(EINA_FALSE);
+}
+
+TEST_F(SearchPageTest, TheGuideBeginsWhereOneReadsFrom) {
+    for (const bool mirrored : {true, false}) {
+        elm_config_mirrored_set(mirrored ? EINA_TRUE : EINA_FALSE);
+        showPage();
+        elm_object_part_text_set(entry, "elm.guide", "\uF897 بحث");
+        stage().settle();
+        const Area around = Stage::area(field);
+        int found = 0;
+        for (const Ink& ink : inkOf(stage().canvas())) {
+            if (!ink.isText || ink.what.find("بحث") == std::string::npos)
+                continue;
+            const double middle = ink.area.x + ink.area.width / 2;
+            EXPECT_EQ(middle > around.middle().x, mirrored) << middle;
+            ++found;
+        }
+        EXPECT_EQ(found, 1);
+        takeStageDown();
+    }
     elm_config_mirrored_set(EINA_FALSE);
 }
 
