@@ -22,10 +22,11 @@ picker_is_open() { xdotool search --onlyvisible --name '^tone-picker$'; }
 picker_is_gone() { ! picker_is_open; }
 picker_opens() { watch_tap $WATCH_TONE && watch_wait 20 picker_is_open && watch_settled; }
 picker_closes() { watch_wait 20 picker_is_gone && watch_settled; }
-# went_and_came TIMES: so often the application was left for another one and came back.
-went_and_came() {
-    [ "$(grep -ac 'goes to the background' "$log")" = "$1" ] && [ "$(grep -ac 'The application comes back' "$log")" = "$1" ]
-}
+# went TIMES, came TIMES: so often the application was left, and so often it came back.
+went() { [ "$(grep -ac 'The application goes to the background' "$log")" = "$1" ]; }
+came() { [ "$(grep -ac 'The application comes back' "$log")" = "$1" ]; }
+went_and_came() { went "$1" && came "$1"; }
+leaves_and_comes() { watch_key F5 && watch_key F6; }
 
 # Settings from outside, before there is a watch.
 check "Another process sets the volume, without a display" elsewhere --set-volume 5
@@ -124,24 +125,24 @@ check "The tone is back" looks_like 15-sound 17-no-power-saving
 check "Another process switches power saving on" elsewhere --power-saving on
 picture 18-not-yet
 check "The editor does not look at it by itself" looks_like 15-sound 18-not-yet
-check "The application comes back" watch_key F6
+check "The application is left and comes back" leaves_and_comes
 picture 19-power-saving
 check "Now the tone is gone" looks_like 16-power-saving 19-power-saving
 check "Another process switches power saving off" elsewhere --power-saving off
-check "The application comes back again" watch_key F6
+check "The application is left and comes back again" leaves_and_comes
 
 # Another tone.
 check "The tone picker opens" picker_opens
 picture 20-picker
 check "It lies over the editor" differs 15-sound 20-picker
-check "The application went to the background" is "$(grep -ac 'goes to the background' "$log")" 1
+check "The application went to the background" went 3
 check "Another process sets the volume behind it" elsewhere --set-volume 9
 check "The tone below the marked one is tapped" watch_tap $WATCH_TONE_BELOW
 picture 21-marked
 check "It is marked" differs 20-picker 21-marked
 check "Done is tapped in the picker" watch_tap $WATCH_DONE
 check "The picker goes" picker_closes
-check "The application came back" watch_wait 5 went_and_came 1
+check "The application came back" watch_wait 5 went_and_came 3
 picture 22-chosen
 check "The editor shows what has changed" differs 15-sound 22-chosen
 check "The level that was set meanwhile is stored" done_with_volume 9
@@ -155,7 +156,7 @@ picture 23-before
 check "The tone picker opens again" picker_opens
 check "The picker is killed" kill -KILL "$(pgrep -P "$watch_pid" -f com.vendra.setting.sound-tone-list)"
 check "Its window goes" picker_closes
-check "The application came back from it" watch_wait 5 went_and_came 2
+check "The application came back from it" watch_wait 5 went_and_came 4
 picture 24-after
 check "The editor is as it was" looks_like 23-before 24-after
 check "Its volume can still be changed" watch_tap_volume 1
@@ -171,10 +172,10 @@ check "A bare display starts" watch_display "$work" bare || exit 1
 check "The watch starts on the alarm" starts --edit "$id"
 check "The editor is scrolled to the tone" scrolls 2
 check "The tone picker opens on the bare display" picker_opens
-check "The application was left for it" watch_wait 5 is "$(grep -ac 'goes to the background' "$log")" 3
+check "The application was left for it" watch_wait 5 went 5
 check "Cancel is tapped in the picker" watch_tap $WATCH_CANCEL
 check "The picker goes from the bare display" picker_closes
-check "The application came back once more" watch_wait 5 went_and_came 3
+check "The application came back once more" watch_wait 5 went_and_came 5
 check "The watch ends well again" watch_stop
 CHECK_USUAL_ERRORS+='|app_control_get_extra_data failed|without an answer'
 check "No other error was logged" no_error_is_logged
