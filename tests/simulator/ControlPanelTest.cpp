@@ -204,6 +204,7 @@ TEST_F(ControlPanelTest, buttonsMayBeClickedQuickly) {
 TEST_F(ControlPanelTest, allChoicesAreWrittenEquallyLarge) {
     std::set<int> sizes;
     std::vector<std::pair<std::string, std::string>> chips;
+    chips.reserve(std::size(simulator::LANGUAGES) + 4);
     for (const auto& language : simulator::LANGUAGES)
         chips.emplace_back(std::string("Language ") + language.name, language.name);
     for (const char* other : {"12 hours", "24 hours", "Power saving", "Motion"})

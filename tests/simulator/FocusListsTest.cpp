@@ -23,7 +23,6 @@ using simulator::WorldClockViewController;
 using testing::Contains;
 using testing::ElementsAre;
 using testing::IsSupersetOf;
-using testing::Not;
 
 namespace {
 
