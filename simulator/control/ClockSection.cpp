@@ -32,9 +32,8 @@ std::string format(const char* form, Values... values) {
 std::string dateText(const base::CivilDate& date) {
     static constexpr std::array<const char*, 7> DAYS{"Sun", "Mon", "Tue", "Wed",
                                                      "Thu", "Fri", "Sat"};
-    static constexpr std::array<const char*, 12> MONTHS{
-        "January", "February", "March",     "April",   "May",      "June",
-        "July",    "August",   "September", "October", "November", "December"};
+    static constexpr std::array<const char*, 12> MONTHS{"Jan", "Feb", "Mar", "Apr", "May", "Jun",
+                                                        "Jul", "Aug", "Sep", "Oct", "Nov", "Dec"};
     return format("%s %d %s %d", DAYS.at(static_cast<std::size_t>(base::weekdayOf(date))), date.day,
                   MONTHS.at(static_cast<std::size_t>(date.month) - 1), date.year);
 }
@@ -71,6 +70,9 @@ std::string stepped(int seconds) {
 Readout::Readout(Evas_Object* column) : _layout(elm_layout_add(column)) {
     elm_layout_theme_set(_layout, "simulator", "control", "readout");
     evas_object_name_set(_layout, "Readout");
+    // It is in English, whichever way the face is read.
+    elm_object_mirrored_automatic_set(_layout, EINA_FALSE);
+    elm_object_mirrored_set(_layout, EINA_FALSE);
     place(addRow(column, READOUT_HEIGHT), _layout);
     refresh();
 }

@@ -226,7 +226,7 @@ TEST_F(ControlPanelTest, midnightAndTheChangeOfTheZonesClocksAreOnePressEach) {
     VirtualClock::jump(shift);
     Stage::advance(0.5);
     EXPECT_THAT(hand->part("Readout", "readout.time"), testing::StartsWith("23:59:5"));
-    EXPECT_EQ(hand->part("Readout", "readout.date"), "Wed 18 November 2026");
+    EXPECT_EQ(hand->part("Readout", "readout.date"), "Wed 18 Nov 2026");
     VirtualClock::jump(-shift);
     hand->type("Time zone", "new york");
     hand->key("Return", "\n");
@@ -236,7 +236,7 @@ TEST_F(ControlPanelTest, midnightAndTheChangeOfTheZonesClocksAreOnePressEach) {
     VirtualClock::jump(shift);
     Stage::advance(0.5);
     EXPECT_THAT(hand->part("Readout", "readout.time"), testing::StartsWith("01:59:5"));
-    EXPECT_EQ(hand->part("Readout", "readout.date"), "Sun 14 March 2027");
+    EXPECT_EQ(hand->part("Readout", "readout.date"), "Sun 14 Mar 2027");
     Stage::advance(10);
     EXPECT_THAT(hand->part("Readout", "readout.time"), testing::StartsWith("03:00:0"));
     EXPECT_EQ(hand->part("Readout", "readout.zone"), "America/New_York · UTC−4:00");
@@ -399,7 +399,7 @@ TEST_F(ControlPanelTest, whatIsBeingTypedStays) {
 
 TEST_F(ControlPanelTest, theReadoutShowsTheDevicesTime) {
     EXPECT_THAT(hand->part("Readout", "readout.time"), testing::StartsWith("09:41:0"));
-    EXPECT_EQ(hand->part("Readout", "readout.date"), "Wed 18 November 2026");
+    EXPECT_EQ(hand->part("Readout", "readout.date"), "Wed 18 Nov 2026");
     EXPECT_EQ(hand->part("Readout", "readout.zone"), "Europe/Berlin · UTC+1:00");
     VirtualClock::setNow("Asia/Kolkata", "2027-01-01 23:59:50");
     Stage::advance(0.5);
