@@ -116,6 +116,9 @@ void place(Evas_Object* row, Evas_Object* widget, int width) {
 Evas_Object* addSection(Evas_Object* column, const char* title) {
     Evas_Object* section = elm_layout_add(column);
     elm_layout_theme_set(section, "simulator", "control", "section");
+    // Its title is in English, whichever way the face is read.
+    elm_object_mirrored_automatic_set(section, EINA_FALSE);
+    elm_object_mirrored_set(section, EINA_FALSE);
     elm_object_part_text_set(section, "section.title", title);
     fill(section);
     elm_box_pack_end(column, section);
