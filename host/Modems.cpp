@@ -8,7 +8,7 @@
 #include <string_view>
 #include <thread>
 
-#include <dbus/dbus.h>
+#include "Bus.h"
 
 #define LOG_TAG "device-host"
 #include "base/Log.h"
@@ -29,69 +29,14 @@ constexpr auto ONE_ANSWER = std::chrono::milliseconds(80);
 constexpr const char* OFONO = "org.ofono";
 constexpr const char* SYSTEM_BUS = "unix:path=/run/dbus/system_bus_socket";
 
-struct CloseConnection {
-    void operator()(DBusConnection* connection) const {
-        dbus_connection_close(connection);
-        dbus_connection_unref(connection);
-    }
-};
-struct Unref {
-    void operator()(DBusMessage* message) const { dbus_message_unref(message); }
-};
-using Connection = std::unique_ptr<DBusConnection, CloseConnection>;
-using Message = std::unique_ptr<DBusMessage, Unref>;
-
-class Error {
-public:
-    Error() { dbus_error_init(&_error); }
-    ~Error() { dbus_error_free(&_error); }
-    Error(const Error&) = delete;
-    Error& operator=(const Error&) = delete;
-
-    DBusError* get() { return &_error; }
-    const char* text() const { return _error.message ? _error.message : "unknown"; }
-    bool is(const char* name) const { return dbus_error_has_name(&_error, name); }
-    /** Nobody answered, as against an answer that is an error. */
-    bool isSilence() const {
-        return is(DBUS_ERROR_NO_REPLY) || is(DBUS_ERROR_TIMEOUT) || is(DBUS_ERROR_TIMED_OUT) ||
-               is(DBUS_ERROR_DISCONNECTED);
-    }
-    /** There is no such service, and nothing can start it. */
-    bool isAbsence() const {
-        return is(DBUS_ERROR_SERVICE_UNKNOWN) || is(DBUS_ERROR_NAME_HAS_NO_OWNER);
-    }
-
-private:
-    DBusError _error{};
-};
-
-/** Where a method is. */
-struct Method {
-    const char* service;
-    const char* path;
-    const char* interface;
-    const char* name;
-};
-
-Message call(DBusConnection* connection, const Method& method, Error& error) {
-    const Message message(
-        dbus_message_new_method_call(method.service, method.path, method.interface, method.name));
-    if (!message)
-        return nullptr;
-    return Message(dbus_connection_send_with_reply_and_block(
-        connection, message.get(), static_cast<int>(ONE_ANSWER.count()), error.get()));
+BusMessage ask(DBusConnection* connection, const BusMethod& method, BusError& error) {
+    return callBus(connection, newBusCall(method), ONE_ANSWER, error);
 }
 
 /** A connection of its own: the toolkit's belongs to the main loop. */
-Connection connect(Error& error) {
+BusConnection connect(BusError& error) {
     const char* address = std::getenv("DBUS_SYSTEM_BUS_ADDRESS");
-    Connection connection(
-        dbus_connection_open_private(address && *address ? address : SYSTEM_BUS, error.get()));
-    if (!connection)
-        return nullptr;
-    dbus_connection_set_exit_on_disconnect(connection.get(), FALSE);
-    const Method hello{DBUS_SERVICE_DBUS, DBUS_PATH_DBUS, DBUS_INTERFACE_DBUS, "Hello"};
-    return call(connection.get(), hello, error) ? std::move(connection) : nullptr;
+    return connectToBus(address && *address ? address : SYSTEM_BUS, ONE_ANSWER, error);
 }
 
 bool isAt(DBusMessageIter& at, int type) {
@@ -140,9 +85,9 @@ std::vector<std::string> modemPaths(DBusMessage* message) {
 }
 
 std::optional<std::string> plmnOf(DBusConnection* connection, const std::string& modem) {
-    Error error;
-    const Method method{OFONO, modem.c_str(), "org.ofono.NetworkRegistration", "GetProperties"};
-    const Message answer = call(connection, method, error);
+    BusError error;
+    const BusMethod method{OFONO, modem.c_str(), "org.ofono.NetworkRegistration", "GetProperties"};
+    const BusMessage answer = ask(connection, method, error);
     if (answer) {
         const std::string country = textOf(answer.get(), "MobileCountryCode");
         return country.empty() ? country : country + textOf(answer.get(), "MobileNetworkCode");
@@ -152,15 +97,15 @@ std::optional<std::string> plmnOf(DBusConnection* connection, const std::string&
 }
 
 /** What the thread does. */
-Modems ask() {
-    Error error;
-    const Connection connection = connect(error);
+Modems askInTurn() {
+    BusError error;
+    const BusConnection connection = connect(error);
     if (!connection) {
         LOG_INFO("There is no system bus to ask for modems: %s", error.text());
         return std::vector<Modem>();
     }
-    const Message answer =
-        call(connection.get(), {OFONO, "/", "org.ofono.Manager", "GetModems"}, error);
+    const BusMessage answer =
+        ask(connection.get(), {OFONO, "/", "org.ofono.Manager", "GetModems"}, error);
     if (!answer) {
         LOG_WARNING("oFono tells no modems: %s", error.text());
         return error.isAbsence() ? Modems(std::vector<Modem>()) : std::nullopt;
@@ -180,7 +125,7 @@ std::optional<std::vector<Modem>> askModems() {
         LOG_WARNING("The system bus has not answered the last question for modems yet");
         return std::nullopt;
     }
-    std::packaged_task<Modems()> task(ask);
+    std::packaged_task<Modems()> task(askInTurn);
     auto answer = task.get_future();
     std::thread([task = std::move(task), asking = asking]() mutable {
         task();
