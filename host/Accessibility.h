@@ -4,7 +4,17 @@
  */
 #pragma once
 
+#include <optional>
+#include <string>
+
 namespace host {
+
+/**
+ * @brief Where the session's bus is: what DBUS_SESSION_BUS_ADDRESS says, or else "bus" in
+ *        XDG_RUNTIME_DIR.
+ * @return Nothing when it is a path and there is nothing at it.
+ */
+std::optional<std::string> sessionBus();
 
 /**
  * @brief Lets screen readers of the desktop read the windows.
