@@ -38,22 +38,13 @@ void collectControls(Evas_Object* object, std::vector<Evas_Object*>& controls) {
         collectControls(member, controls);
 }
 
-void nameControls(const Elm_Object_Item* row) {
-    const std::string name = textsOfRow(row);
-    if (name.empty())
-        return;
-    for (Evas_Object* control : controlsOfRow(row))
-        if (isOneOf(NAMELESS, control))
-            efl_access_object_i18n_name_set(control, name.c_str());
-}
-
 /** What is in a row is there once the row is drawn. */
 void drawn(void* list, Evas*, void*) {
     if (!elm_config_atspi_mode_get())
         return;
     auto* object = static_cast<Evas_Object*>(list);
     for (Elm_Object_Item* row : takeList<Elm_Object_Item>(elm_genlist_realized_items_get(object)))
-        nameControls(row);
+        nameControlsInRow(row);
 }
 
 void listDeleted(void*, Evas* canvas, Evas_Object* list, void*) {
@@ -67,6 +58,15 @@ std::vector<Evas_Object*> controlsOfRow(const Elm_Object_Item* row) {
     for (Evas_Object* content : contentsOfRow(row))
         collectControls(content, controls);
     return controls;
+}
+
+void nameControlsInRow(const Elm_Object_Item* row) {
+    const std::string name = textsOfRow(row);
+    if (name.empty())
+        return;
+    for (Evas_Object* control : controlsOfRow(row))
+        if (isOneOf(NAMELESS, control) && readName(control) != name)
+            setReadName(control, name);
 }
 
 void setReadName(Evas_Object* widget, const std::string& name) {
@@ -91,9 +91,16 @@ void setReadAsSpinner(Evas_Object* widget) {
     efl_access_object_role_set(widget, EFL_ACCESS_ROLE_SPIN_BUTTON);
 }
 
-void tellFocus(Elm_Object_Item* row) {
+void tellFocus(Eo* thing) {
     if (elm_config_atspi_mode_get())
-        efl_access_state_changed_signal_emit(row, EFL_ACCESS_STATE_TYPE_FOCUSED, EINA_TRUE);
+        efl_access_state_changed_signal_emit(thing, EFL_ACCESS_STATE_TYPE_FOCUSED, EINA_TRUE);
+}
+
+void focusSilently(Evas_Object* widget) {
+    const Efl_Access_Type type = efl_access_object_access_type_get(widget);
+    efl_access_object_access_type_set(widget, EFL_ACCESS_TYPE_DISABLED);
+    elm_object_focus_set(widget, EINA_TRUE);
+    efl_access_object_access_type_set(widget, type);
 }
 
 void nameControlsInRows(Evas_Object* list) {

@@ -20,11 +20,17 @@ void setReadTextId(Evas_Object* widget, const char* textId);
 /** @brief Says that a widget's value is turned up and down. */
 void setReadAsSpinner(Evas_Object* widget);
 
-/** @brief Tells that keys have reached a row. */
-void tellFocus(Elm_Object_Item* row);
+/** @brief Tells that keys have reached a widget or a row. */
+void tellFocus(Eo* thing);
+
+/** @brief Gives a widget the toolkit's focus without a word about it. */
+void focusSilently(Evas_Object* widget);
 
 /** @brief Buttons, switches, fields and the like in a row; empty while it has no picture. */
 std::vector<Evas_Object*> controlsOfRow(const Elm_Object_Item* row);
+
+/** @brief Gives switches, marks and fields in a row the name of the row, if it has one. */
+void nameControlsInRow(const Elm_Object_Item* row);
 
 /**
  * @brief Gives switches, marks and fields in the rows of a list the names of their rows.

@@ -2,6 +2,7 @@
 
 #include <ctime>
 
+#include "Accessible.h"
 #include "Index.h"
 #include "ThemeNames.h"
 #include "TimeWheel.h"
@@ -76,7 +77,7 @@ void turn(const FocusThing& thing, int steps) {
 
 void dropToolkitFocus(const Evas_Object* window, Evas_Object* taker) {
     if (taker)
-        elm_object_focus_set(taker, EINA_TRUE);
+        focusSilently(taker);
     else if (Evas_Object* focused = elm_object_focused_object_get(window))
         elm_object_focus_set(focused, EINA_FALSE);
 }

@@ -131,10 +131,19 @@ bool FocusNavigator::stopTurning(const Evas_Object* object) {
     return true;
 }
 
-bool FocusNavigator::hasFocus(const Elm_Object_Item* row) {
+void FocusNavigator::reach(Elm_Object_Item* row) {
+    Evas_Object* list = elm_object_item_widget_get(row);
+    FocusNavigator* navigator = of(evas_object_evas_get(list));
+    if (!navigator || !navigator->enterPage())
+        return;
+    navigator->lead(true);
+    navigator->take({FocusKind::Row, list, list, row, 0, {}}, true);
+}
+
+std::optional<bool> FocusNavigator::hasFocus(const Elm_Object_Item* row) {
     const FocusNavigator* navigator = of(evas_object_evas_get(elm_object_item_widget_get(row)));
     if (!navigator || !navigator->_idle || !navigator->_root)
-        return false;
+        return std::nullopt;
     const auto& thing = navigator->_memories.at(navigator->_root).thing;
     return thing && thing->kind == FocusKind::Row && thing->item == row;
 }
@@ -362,28 +371,35 @@ void FocusNavigator::focus(const std::optional<FocusThing>& thing, bool byKeyboa
     lead(true);
     if (!thing)
         return;
+    bringToMiddle(*thing);
+    take(*thing, byKeyboard);
+}
+
+void FocusNavigator::take(const FocusThing& thing, bool byKeyboard) {
     Memory& memory = _memories[_root];
     const auto before = memory.thing ? FocusView(_root).seen(*memory.thing) : std::nullopt;
-    if (before && !isSame(*before, *thing))
+    if (before && !isSame(*before, thing))
         hideRing(*before);
     _turning = false;
     memory.thing = thing;
-    memory.index = thing->item ? elm_genlist_item_index_get(thing->item) - 1 : -1;
-    showRing(*thing, false);
-    bringToMiddle(*thing);
+    memory.index = thing.item ? elm_genlist_item_index_get(thing.item) - 1 : -1;
+    showRing(thing, false);
     // The bezel only passes over a field: the keypad opens when it is pressed. A calendar would
     // ring a day of its own.
-    const bool keepsKeys = thing->kind == FocusKind::Row || thing->kind == FocusKind::Calendar ||
-                           (thing->kind == FocusKind::Field && !byKeyboard);
+    // It may not have been drawn yet.
+    if (thing.item)
+        nameControlsInRow(thing.item);
+    const bool keepsKeys = thing.kind == FocusKind::Row || thing.kind == FocusKind::Calendar ||
+                           (thing.kind == FocusKind::Field && !byKeyboard);
     if (keepsKeys)
         dropToolkitFocus(_window, FocusView(_root).button());
     else
-        giveToolkitFocus(*thing);
-    if (thing->kind == FocusKind::Row)
-        tellFocus(thing->item);
-    if (thing->list && !evas_object_data_get(thing->list, HEARD_KEY)) {
-        evas_object_data_set(thing->list, HEARD_KEY, thing->list);
-        evas_object_smart_callback_add(thing->list, REALIZED, _rowRealizedCb, nullptr);
+        giveToolkitFocus(thing);
+    if (thing.kind == FocusKind::Row)
+        tellFocus(thing.item);
+    if (thing.list && !evas_object_data_get(thing.list, HEARD_KEY)) {
+        evas_object_data_set(thing.list, HEARD_KEY, thing.list);
+        evas_object_smart_callback_add(thing.list, REALIZED, _rowRealizedCb, nullptr);
     }
 }
 
@@ -449,6 +465,7 @@ void FocusNavigator::showReturned() {
         return;
     memory.thing = thing;
     showRing(*thing, false);
+    tellFocus(thing->kind == FocusKind::Row ? thing->item : thing->object);
 }
 
 } // namespace host

@@ -29,8 +29,10 @@ public:
     static void install(Evas_Object* window);
     /** Ends turning in the window of an object; false when nothing was being turned. */
     static bool stopTurning(const Evas_Object* object);
-    /** Whether keys have reached a row. */
-    static bool hasFocus(const Elm_Object_Item* row);
+    /** Gives a row of the page that keys are for the focus, wherever the row is. */
+    static void reach(Elm_Object_Item* row);
+    /** Whether keys have reached a row; nothing while they do not lead. */
+    static std::optional<bool> hasFocus(const Elm_Object_Item* row);
 
     FocusNavigator(const FocusNavigator&) = delete;
     FocusNavigator& operator=(const FocusNavigator&) = delete;
@@ -69,6 +71,7 @@ private:
     std::optional<FocusThing> found(const FocusView& view) const;
     std::optional<FocusThing> remade(const FocusView& view) const;
     void focus(const std::optional<FocusThing>& thing, bool byKeyboard);
+    void take(const FocusThing& thing, bool byKeyboard);
     void startTurning(bool turning);
     /** The bezel is pressed: a row waits whether it is held. @return False for all else. */
     bool startPress();

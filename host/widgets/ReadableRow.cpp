@@ -44,6 +44,7 @@ bool isInReach(const Elm_Object_Item* row) {
 Eina_Bool pressRow(Evas_Object* row, const char*) {
     if (!host::canPressRow(row) || !isInReach(row))
         return EINA_FALSE;
+    host::FocusNavigator::reach(row);
     host::activate({host::FocusKind::Row, nullptr, nullptr, row, 0, {}});
     return EINA_TRUE;
 }
@@ -112,8 +113,13 @@ Efl_Access_State_Set statesOf(const Eo* row, void*) {
         efl_access_object_state_set_get(efl_super(row, readableRowClass()));
     if (isMarked(row))
         STATE_TYPE_SET(states, EFL_ACCESS_STATE_TYPE_CHECKED);
-    if (host::FocusNavigator::hasFocus(row))
-        STATE_TYPE_SET(states, EFL_ACCESS_STATE_TYPE_FOCUSED);
+    // The toolkit goes on to call a row focused that keys have left.
+    if (const auto hasFocus = host::FocusNavigator::hasFocus(row)) {
+        if (*hasFocus)
+            STATE_TYPE_SET(states, EFL_ACCESS_STATE_TYPE_FOCUSED);
+        else
+            STATE_TYPE_UNSET(states, EFL_ACCESS_STATE_TYPE_FOCUSED);
+    }
     return states;
 }
 

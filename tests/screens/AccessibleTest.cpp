@@ -157,6 +157,53 @@ TEST_F(AccessibleTest, ARowThatKeysHaveReachedHasTheFocus) {
     EXPECT_THAT(focused(), Not(Contains("Alarm type, Sound")));
 }
 
+TEST_F(AccessibleTest, OnlyWhatKeysHaveReachedIsAnnounced) {
+    createAlarm();
+    pick(7, 30);
+    FocusWalk walk(stage(), Hand::Keys);
+    ASSERT_TRUE(walk.goTo("DATE"));
+    reader.takeFocusTold();
+    stage().key("Tab");
+    EXPECT_THAT(reader.takeFocusTold(), ElementsAre("list item | Repeat weekly, Never"));
+    stage().key("Tab");
+    EXPECT_THAT(reader.takeFocusTold(), ElementsAre("list item | Alarm type, Sound"));
+}
+
+TEST_F(AccessibleTest, AFieldThatComesIntoSightIsAnnouncedByItsRow) {
+    open("Alarm type");
+    EXPECT_TRUE(press(popup(), "list item", "Vibration"));
+    FocusWalk walk(stage(), Hand::Keys);
+    ASSERT_TRUE(walk.goTo("Snooze"));
+    stage().settle();
+    reader.takeFocusTold();
+    stage().key("Tab");
+    EXPECT_THAT(reader.takeFocusTold(), Contains("entry | Alarm name"));
+}
+
+TEST_F(AccessibleTest, WhereTheFocusComesBackToIsAnnounced) {
+    createAlarm();
+    pick(7, 30);
+    FocusWalk walk(stage(), Hand::Keys);
+    ASSERT_TRUE(walk.goTo("Alarm type"));
+    walk.press();
+    ASSERT_TRUE(walk.goTo("Vibration"));
+    reader.takeFocusTold();
+    walk.press();
+    stage().settle();
+    EXPECT_THAT(reader.takeFocusTold(), Contains("list item | Alarm type, Vibration"));
+    EXPECT_THAT(focused(), ElementsAre("Alarm type, Vibration"));
+}
+
+TEST_F(AccessibleTest, ARowThatAReaderPressesHasTheFocusAndKeysGoOnFromThere) {
+    open("Alarm type");
+    EXPECT_TRUE(press(popup(), "list item", "Vibration"));
+    EXPECT_THAT(reader.takeFocusTold(), Contains("list item | Alarm type, Vibration"));
+    EXPECT_THAT(focused(), ElementsAre("Alarm type, Vibration"));
+    stage().key("Tab");
+    stage().settle();
+    EXPECT_THAT(focused(), ElementsAre(StartsWith("Snooze, ")));
+}
+
 TEST_F(AccessibleTest, TheRepeatScreenIsRead) {
     open("Repeat weekly");
     EXPECT_EQ(

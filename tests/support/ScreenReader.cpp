@@ -7,6 +7,7 @@
 #include "support/ScreenReader.h"
 
 #include <set>
+#include <utility>
 
 #include <gtest/gtest.h>
 
@@ -75,12 +76,29 @@ std::string ReadThing::line() const {
     return role + " | " + name + (checked ? " | checked" : "") + (disabled ? " | disabled" : "");
 }
 
-ScreenReader::ScreenReader() {
+ScreenReader::ScreenReader() : _handler(efl_access_object_event_handler_add(stateChangedCb, this)) {
     elm_config_atspi_mode_set(EINA_TRUE);
 }
 
 ScreenReader::~ScreenReader() {
+    efl_access_object_event_handler_del(static_cast<Efl_Access_Event_Handler*>(_handler));
     elm_config_atspi_mode_set(EINA_FALSE);
+}
+
+void ScreenReader::stateChangedCb(void* data, const Efl_Event* event) {
+    if (event->desc != EFL_ACCESS_OBJECT_EVENT_STATE_CHANGED) {
+        return;
+    }
+    const auto* change = static_cast<const Efl_Access_Event_State_Changed_Data*>(event->info);
+    if (change->type == EFL_ACCESS_STATE_TYPE_FOCUSED && change->new_value != EINA_FALSE) {
+        static_cast<ScreenReader*>(data)->_focusTold.push_back(
+            text(efl_access_object_role_name_get(event->object)) + " | " +
+            text(efl_access_object_i18n_name_get(event->object)));
+    }
+}
+
+std::vector<std::string> ScreenReader::takeFocusTold() {
+    return std::exchange(_focusTold, {});
 }
 
 std::vector<ReadThing> ScreenReader::things(Eo* root) {

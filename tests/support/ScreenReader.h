@@ -44,4 +44,12 @@ public:
     static std::vector<std::string> announced(Eo* window);
     /** Presses the first thing of a role and a name. @return False when it cannot be pressed. */
     static bool press(Eo* root, const std::string& role, const std::string& name);
+    /** Where the focus was said to have gone since the last call: "push button | Back". */
+    std::vector<std::string> takeFocusTold();
+
+private:
+    static void stateChangedCb(void* data, const Efl_Event* event);
+
+    void* _handler;
+    std::vector<std::string> _focusTold;
 };
