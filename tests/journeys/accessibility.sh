@@ -15,6 +15,11 @@ listens() {
     watch_pids+=($!)
     watch_wait 20 grep -q listening "$pictures/heard.txt"
 }
+keeps() {
+    "$journeys/reader.py" clock-sim keep "$1" >"$pictures/kept.txt" 2>>"$pictures/reader.log" &
+    watch_pids+=($!)
+    watch_wait 20 grep -q keeping "$pictures/kept.txt"
+}
 session_starts() {
     DBUS_SESSION_BUS_ADDRESS=unix:path=$work/bus
     export DBUS_SESSION_BUS_ADDRESS
@@ -53,8 +58,18 @@ check "The reader opens the type" reader press 'Alarm type, *'
 check "The popup is called by its title" reader find Type
 check "The reader chooses a type" reader press Vibration
 check "The editor has the type" reader find 'Alarm type, Vibration'
-check "A key leads the focus on" watch_key Tab Tab Tab Tab Tab Tab
-check "The reader is told of the row" hears 'focused \| list item \| Repeat weekly, Mon.*'
+check "It is told where the focus comes back to" hears 'focused \| list item \| Alarm type, Vibration'
+check "A key leads the focus on" watch_key Tab
+check "The reader is told of the row" hears 'focused \| list item \| Snooze, .*'
+check "The editor is read again" tree 4-focus
+check "The row is that" reads 4-focus 'list item \| Snooze, .* \| focused'
+check "A reader keeps a key" keeps Down
+check "The key is pressed" watch_key Down
+check "The reader has had it" watch_wait 10 grep -qx 'kept Down' "$pictures/kept.txt"
+check "The editor is read once more" tree 5-kept
+check "The focus is where it was" reads 5-kept 'list item \| Snooze, .* \| focused'
+check "Another key is pressed" watch_key Tab
+check "The watch has had it" hears 'focused \| entry \| Alarm name'
 check "The reader sets the alarm" reader press Done
 check "The toast is announced" hears 'showing \| notification \| Alarm set for .*'
 check "The alarm is stored" watch_wait 10 alarms_are 1

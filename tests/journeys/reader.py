@@ -1,11 +1,12 @@
 #!/usr/bin/python3
 """A screen reader in small: looks at what an application shows, and presses what it names.
 
-usage: reader.py APPLICATION tree|press NAME|find NAME|listen
+usage: reader.py APPLICATION tree|press NAME|find NAME|listen|keep KEY
 
 "tree" prints a line for each thing: its role, its name and its states. "press" does the first
 action of the thing of that name, "find" succeeds when there is one. A name that ends with a star is
 the beginning of one. "listen" prints what is announced and where the focus goes, until it is ended.
+"keep" takes a key for itself, and prints it each time it is pressed, until it is ended.
 """
 
 import sys
@@ -69,6 +70,20 @@ def listen():
     pyatspi.Registry.start()
 
 
+def keep(wanted):
+    def take(event):
+        if event.event_string != wanted:
+            return False
+        print("kept", event.event_string, flush=True)
+        return True
+
+    pyatspi.Registry.registerKeystrokeListener(
+        take, kind=(pyatspi.KEY_PRESSED_EVENT,), synchronous=True, preemptive=True
+    )
+    print("keeping", flush=True)
+    pyatspi.Registry.start()
+
+
 def find(name, wanted):
     """The thing that is called so, once the application shows one."""
     end = time.monotonic() + SECONDS
@@ -85,6 +100,9 @@ def main():
     name, verb = sys.argv[1:3]
     if verb == "listen":
         listen()
+        return
+    if verb == "keep":
+        keep(sys.argv[3])
         return
     if verb == "tree":
         top = application(name)
