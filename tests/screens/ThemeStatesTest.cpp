@@ -147,6 +147,19 @@ TEST_P(ThemeButtonTest, IsAsBeforeOnceItIsReleased) {
     EXPECT_EQ(look().unlike(before), 0);
 }
 
+TEST_P(ThemeButtonTest, ANewTextLeavesItDisabled) {
+    elm_object_disabled_set(widget, EINA_TRUE);
+    const char* const text = elm_object_text_get(widget);
+    const std::string word = text ? text : "";
+    const Look disabled = look();
+    elm_object_text_set(widget, "Other");
+    EXPECT_LT(look().brightest(), 200) << "the colour of a text that can be pressed";
+    elm_object_text_set(widget, "");
+    stage().settle();
+    elm_object_text_set(widget, word.c_str());
+    EXPECT_EQ(look().unlike(disabled), 0);
+}
+
 INSTANTIATE_TEST_SUITE_P(Buttons, ThemeButtonTest, testing::ValuesIn(buttons()), nameOf);
 
 } // namespace
