@@ -18,6 +18,8 @@ struct Contrast {
 /** Texts need more than large digits, icons and knobs. */
 constexpr double BODY = 4.5;
 constexpr double LARGE = 3;
+/** What cannot be used now can still be read. */
+constexpr double DISABLED = 3.5;
 
 class ThemeContrastTest : public ScreenTest {
 protected:
@@ -71,6 +73,15 @@ TEST_F(ThemeContrastTest, EveryTextStandsOut) {
     for (const Contrast& pair : pairs)
         EXPECT_GE(contrast(pair.text, pair.ground), pair.least)
             << pair.text << " on " << pair.ground;
+}
+
+TEST_F(ThemeContrastTest, ADisabledTextCanBeReadAndIsClearlyPaler) {
+    for (const char* ground : {"ground", "surface.disabled"}) {
+        const double disabled = contrast("text.disabled", ground);
+        EXPECT_GE(disabled, DISABLED) << ground;
+        for (const char* text : {"text", "text.second"})
+            EXPECT_GE(contrast(text, ground), 2 * disabled) << text << " on " << ground;
+    }
 }
 
 TEST_F(ThemeContrastTest, AnEqualColourHasNone) {
