@@ -1,48 +1,23 @@
-// The tone picker without a finger. Its page is filled as its program does it.
+// The tone picker without a finger.
 
-#include <memory>
+#include <string>
+#include <vector>
 
 #include <gtest/gtest.h>
 
-#include "TonePage.h"
+#include "screens/ToneFixture.h"
 #include "support/FocusWalk.h"
-#include "support/ScreenTest.h"
 
 namespace {
 
 using Names = std::vector<std::string>;
 
-class FocusToneTest : public ScreenTest, public testing::WithParamInterface<Hand> {
+class FocusToneTest : public ToneFixture, public testing::WithParamInterface<Hand> {
 protected:
-    void TearDown() override {
-        // The window goes before the page.
-        takeStageDown();
-        _page.reset();
-        ScreenTest::TearDown();
-    }
     FocusWalk walk() { return {stage(), GetParam()}; }
     void open(int marked) {
-        std::vector<tone_picker::Tone> tones;
-        for (const char* title : {"Bells", "Crickets", "Morning", "Ocean", "Rain", "Zephyr"})
-            tones.push_back({std::string(title) + ".wav", title});
-        _page = std::make_unique<tone_picker::TonePage>(
-            tones, marked,
-            tone_picker::TonePage::Actions{.marked = [this](int position) { heard = position; },
-                                           .done = [this](int position) { chosen = position; },
-                                           .cancelled =
-                                               [this] {
-                                                   ++cancels;
-                                               }});
-        _page->show(stage().window());
-        stage().settle();
+        openTones({"Bells", "Crickets", "Morning", "Ocean", "Rain", "Zephyr"}, marked);
     }
-
-    int heard = -1;
-    int chosen = -1;
-    int cancels = 0;
-
-private:
-    std::unique_ptr<tone_picker::TonePage> _page;
 };
 
 INSTANTIATE_TEST_SUITE_P(Hands, FocusToneTest, testing::Values(Hand::Keys, Hand::Bezel),

@@ -1,7 +1,6 @@
 // The simulator's own pages in every language, and while the language changes.
 
 #include <algorithm>
-#include <filesystem>
 #include <functional>
 #include <optional>
 #include <string>
@@ -29,18 +28,7 @@ using testing::IsEmpty;
 
 namespace {
 
-namespace fs = std::filesystem;
-
 const std::string THEME = CLOCK_RESOURCE_DIR "/edje/simulator.edj";
-
-std::vector<std::string> languages() {
-    std::vector<std::string> names;
-    for (const auto& file : fs::directory_iterator(CLOCK_SOURCE_DIR "/po"))
-        if (file.path().extension() == ".po")
-            names.push_back(file.path().stem());
-    std::sort(names.begin(), names.end());
-    return names;
-}
 
 class LanguagesTest : public ScreenTest, public testing::WithParamInterface<std::string> {
 protected:
@@ -207,7 +195,7 @@ TEST_P(LanguagesTest, TheQuickPanelFollowsAndFits) {
     panel.toggle();
 }
 
-INSTANTIATE_TEST_SUITE_P(Language, LanguagesTest, testing::ValuesIn(languages()),
+INSTANTIATE_TEST_SUITE_P(Language, LanguagesTest, testing::ValuesIn(catalogueLanguages()),
                          [](const auto& language) { return language.param; });
 
 } // namespace

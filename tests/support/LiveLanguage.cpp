@@ -1,5 +1,8 @@
 #include "support/LiveLanguage.h"
 
+#include <algorithm>
+#include <filesystem>
+
 #include <clock/ClockEventListener.h>
 
 #include "host/Language.h"
@@ -10,6 +13,15 @@ namespace {
 constexpr const char* LANGUAGE_KEY = "db/setting/language";
 
 } // namespace
+
+std::vector<std::string> catalogueLanguages() {
+    std::vector<std::string> codes;
+    for (const auto& file : std::filesystem::directory_iterator(CLOCK_SOURCE_DIR "/po"))
+        if (file.path().extension() == ".po")
+            codes.push_back(file.path().stem());
+    std::ranges::sort(codes);
+    return codes;
+}
 
 LiveLanguage::LiveLanguage() {
     restart();

@@ -5,6 +5,10 @@
 #pragma once
 
 #include <string>
+#include <vector>
+
+/** The languages that the clock has a catalogue for, in the order of their codes. */
+std::vector<std::string> catalogueLanguages();
 
 /** The desktop device's own following of the language, on the recording device's settings. */
 class LiveLanguage {

@@ -11,7 +11,7 @@
 namespace tone_picker {
 namespace {
 
-constexpr const char* TITLE = "IDS_CLOCK_TMBODY_ALARM_TONE";
+constexpr const char* TITLE = "IDS_ALM_HEADER_TONE";
 constexpr const char* NO_TONES = "IDS_ALM_BODY_NO_TONES";
 constexpr const char* CANCEL = "IDS_TPLATFORM_ACBUTTON_CANCEL_ABB";
 constexpr const char* DONE = "IDS_TPLATFORM_ACBUTTON_DONE_ABB";
