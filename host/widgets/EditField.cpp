@@ -1,5 +1,6 @@
 #include "EditField.h"
 
+#include <algorithm>
 #include <string_view>
 
 #include "Accessible.h"
@@ -14,6 +15,7 @@ namespace host {
 namespace {
 
 constexpr const char* ENTRY_KEY = "device-host.edit-field.entry";
+constexpr const char* CURSOR_KEY = "device-host.edit-field.cursor";
 
 /** Not elm_entry_is_empty(), which moves the cursor. */
 bool hasText(const Evas_Object* field) {
@@ -53,21 +55,76 @@ void fieldDeleted(void* data, Evas*, Evas_Object* field, void*) {
     evas_object_data_del(field, ENTRY_KEY);
 }
 
-void turnGuideIn(Evas_Object* object, Evas_BiDi_Direction direction) {
+void bringCursorIn(void* data) {
+    auto* entry = static_cast<Evas_Object*>(data);
+    evas_object_data_del(entry, CURSOR_KEY);
+    int x = 0;
+    int y = 0;
+    int width = 0;
+    int height = 0;
+    if (elm_object_focus_get(entry) &&
+        elm_entry_cursor_geometry_get(entry, &x, &y, &width, &height))
+        elm_scroller_region_show(entry, x, y, std::max(width, 1), height);
+}
+
+void bringCursorInLater(Evas_Object* entry) {
+    if (!evas_object_data_get(entry, CURSOR_KEY))
+        evas_object_data_set(entry, CURSOR_KEY, ecore_job_add(bringCursorIn, entry));
+}
+
+/** The toolkit looks for the cursor before a line that ends at the right has its new width. */
+void lineResized(void* entry, Evas*, Evas_Object*, void*) {
+    bringCursorInLater(static_cast<Evas_Object*>(entry));
+}
+
+void entryDeleted(void*, Evas*, Evas_Object* entry, void*) {
+    if (auto* job = static_cast<Ecore_Job*>(evas_object_data_del(entry, CURSOR_KEY)))
+        ecore_job_del(job);
+}
+
+/** What draws the line and its guide, within an entry that scrolls. */
+Evas_Object* lineOf(Evas_Object* object) {
     const bool isEdje = std::string_view(evas_object_type_get(object)) == "edje";
-    const Evas_Object* guide =
-        isEdje ? edje_object_part_object_get(object, theme::PART_GUIDE) : nullptr;
-    for (Evas_Object* member : membersOf(object)) {
-        if (member == guide)
-            evas_object_paragraph_direction_set(member, direction);
-        turnGuideIn(member, direction);
-    }
+    if (isEdje && edje_object_part_exists(object, theme::PART_GUIDE))
+        return object;
+    for (Evas_Object* member : membersOf(object))
+        if (Evas_Object* line = lineOf(member))
+            return line;
+    return nullptr;
 }
 
 /** A guide may begin with a symbol of the device's font, which would have it begin at the left. */
-void turnGuide(void*, Evas_Object* entry, void*) {
-    turnGuideIn(entry, elm_object_mirrored_get(entry) ? EVAS_BIDI_DIRECTION_RTL
-                                                      : EVAS_BIDI_DIRECTION_INHERIT);
+void turnGuide(const Evas_Object* line, bool mirrored) {
+    const Evas_Object* guide = edje_object_part_object_get(line, theme::PART_GUIDE);
+    for (Evas_Object* member : membersOf(line))
+        if (member == guide)
+            evas_object_paragraph_direction_set(member, mirrored ? EVAS_BIDI_DIRECTION_RTL
+                                                                 : EVAS_BIDI_DIRECTION_INHERIT);
+}
+
+/** What is typed begins where one reads from, and runs as its own letters do. */
+void turnText(Evas_Object* entry, bool mirrored) {
+    if (elm_entry_text_style_user_peek(entry))
+        elm_entry_text_style_user_pop(entry);
+    // The cursor stands in the margin.
+    if (mirrored)
+        elm_entry_text_style_user_push(entry, "DEFAULT='align=right right_margin=3'");
+    bringCursorInLater(entry);
+}
+
+void turn(void*, Evas_Object* entry, void*) {
+    const bool mirrored = elm_object_mirrored_get(entry) != EINA_FALSE;
+    turnText(entry, mirrored);
+    if (const Evas_Object* line = lineOf(entry))
+        turnGuide(line, mirrored);
+}
+
+void followFace(Evas_Object* entry) {
+    turn(nullptr, entry, nullptr);
+    evas_object_smart_callback_add(entry, "language,changed", turn, nullptr);
+    evas_object_event_callback_add(entry, EVAS_CALLBACK_DEL, entryDeleted, nullptr);
+    if (Evas_Object* line = lineOf(entry))
+        evas_object_event_callback_add(line, EVAS_CALLBACK_RESIZE, lineResized, entry);
 }
 
 /** Focuses first: who empties a field types on, and screens take the change for a person's. */
@@ -90,14 +147,14 @@ Evas_Object* addClearButton(Evas_Object* field) {
 void addEntryOf(Evas_Object* field) {
     Evas_Object* entry = addEntry(field, true);
     elm_object_style_set(entry, theme::STYLE_SEARCH);
+    // The style has a guide of its own.
+    turn(nullptr, entry, nullptr);
     elm_object_part_content_set(field, theme::PART_FIELD_ENTRY, entry);
     evas_object_data_set(field, ENTRY_KEY, entry);
     for (const char* event : {"changed", "preedit,changed"})
         evas_object_smart_callback_add(entry, event, textChanged, field);
     evas_object_smart_callback_add(entry, "focused", entryFocused, field);
     evas_object_smart_callback_add(entry, "unfocused", entryUnfocused, field);
-    turnGuide(nullptr, entry, nullptr);
-    evas_object_smart_callback_add(entry, "language,changed", turnGuide, nullptr);
     evas_object_event_callback_add(field, EVAS_CALLBACK_DEL, fieldDeleted, entry);
 }
 
@@ -114,6 +171,7 @@ Evas_Object* addEntry(Evas_Object* parent, bool singleLine) {
     elm_scroller_policy_set(entry, ELM_SCROLLER_POLICY_OFF, ELM_SCROLLER_POLICY_OFF);
     evas_object_size_hint_weight_set(entry, EVAS_HINT_EXPAND, EVAS_HINT_EXPAND);
     evas_object_size_hint_align_set(entry, EVAS_HINT_FILL, EVAS_HINT_FILL);
+    followFace(entry);
     return entry;
 }
 
