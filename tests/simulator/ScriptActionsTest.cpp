@@ -185,6 +185,18 @@ TEST_F(ScriptActions, AMessageIsFoundInTheLanguageThatIsShown) {
     EXPECT_EQ(does("tap @IDS_GONE"), "there is no text");
 }
 
+TEST_F(ScriptActions, EachCommandReadsPastMarksOfDirection) {
+    device.rows = {"\u200Fإنشاء", "\u2068Yoga\u2069\u200E", "c", "d", "e",
+                   "f",           "\u202BRun\u202C 5"};
+    for (const char* line : {"tap Yoga", "hold Yoga", "wait Yoga 1", "expect Yoga",
+                             "scroll-to 'Run 5'", "tap 'Run 5'"})
+        EXPECT_EQ(does(line), "") << line;
+    EXPECT_GT(device.scrolled, 0);
+    device.scrolled = 0;
+    for (const char* line : {"wait gone Yoga 1", "expect-not Yoga"})
+        EXPECT_NE(does(line), "") << line;
+}
+
 TEST_F(ScriptActions, NothingIsTouchedWhileTheFaceMoves) {
     device.rows = {"Done"};
     device.moving = "the face does not stand still";

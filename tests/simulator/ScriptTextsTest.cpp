@@ -40,6 +40,24 @@ TEST(ScriptTexts, WhiteSpaceCountsAsPeopleReadIt) {
     EXPECT_EQ(asRead("Z\xC3rich"), "Z\xC3rich") << "broken text stays as it is";
 }
 
+TEST(ScriptTexts, MarksOfDirectionAreNotCompared) {
+    // Marks, embeddings, overrides and isolates, with their ends.
+    for (const char* const mark : {"\u200E", "\u200F", "\u061C", "\u202A", "\u202B", "\u202C",
+                                   "\u202D", "\u202E", "\u2066", "\u2067", "\u2068", "\u2069"}) {
+        const std::string m = mark;
+        for (const std::string& drawn :
+             {m + "Yoga", "Yoga" + m, "Yo" + m + "ga", m + " Yoga " + m, m + m + "Yoga" + m}) {
+            SCOPED_TRACE(testing::PrintToString(drawn));
+            EXPECT_EQ(asRead(drawn), "Yoga");
+            const std::vector<VisibleText> face{at("Yoga today", 90, 40), at(drawn, 150, 90)};
+            EXPECT_EQ(matchText(face, "Yoga", Match::Whole).problem, "");
+            EXPECT_EQ(matchText(face, "Yoga", Match::Whole).index, 1U);
+            EXPECT_EQ(matchText({at(drawn + ", غدًا", 150, 90)}, "Yoga").problem, "");
+            EXPECT_EQ(matchText({at("Yoga", 150, 90)}, drawn).problem, "") << "what is looked for";
+        }
+    }
+}
+
 TEST(ScriptTexts, AWholeTextIsFoundOrItsBeginning) {
     EXPECT_EQ(matchText(EDITOR, "Done").index, 2U);
     EXPECT_EQ(matchText(EDITOR, "Done").problem, "");
