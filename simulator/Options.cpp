@@ -233,7 +233,10 @@ std::string helpText() {
         text += "  " + name + row.help + "\n";
     }
     text += "\nKeys:\n" + keysHelpText();
-    text += "\nCommands of --script and --command:\n" + commandsHelpText();
+    text +=
+        "\nCommands of --script and --command; a TEXT of several words stands in quotes, as in\n"
+        "\"World clock\" or 'World clock':\n" +
+        commandsHelpText();
     text +=
         "\nExit status: 0 after a normal end, 1 when the watch cannot start, 2 for a command "
         "line\nthat makes no sense. A watch that runs takes over what another clock-sim sets.\n";

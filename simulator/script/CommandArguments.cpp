@@ -40,8 +40,17 @@ std::string notSeconds(const std::string& text) {
 
 std::string notPlace(const Arguments& arguments, std::size_t at) {
     return "'" + arguments[at] + " " + arguments[at + 1] +
-           "' is no place on the face: x and y go from 0 to 359 (a text of several words needs "
-           "quotes)";
+           "' is no place on the face: x and y go from 0 to 359";
+}
+
+std::string notTextOrPlace(const Arguments& arguments) {
+    if (!wholeNumber(arguments[0]) && !wholeNumber(arguments[1]))
+        return NEEDS_QUOTES;
+    return notPlace(arguments, 0) + " (" + NEEDS_QUOTES + ")";
+}
+
+std::string notSecondsAfterText(const std::string& text) {
+    return notSeconds(text) + " (" + NEEDS_QUOTES + ")";
 }
 
 } // namespace simulator

@@ -3,6 +3,7 @@
 #include <algorithm>
 
 #include "Actions.h"
+#include "CommandArguments.h"
 
 namespace simulator {
 
@@ -109,7 +110,7 @@ std::string checkCommand(const std::vector<std::string>& words) {
     if (arguments.size() < command->least)
         return "something is missing: " + usage(*command);
     if (arguments.size() > command->most)
-        return "there is too much: " + usage(*command) + " (a text of several words needs quotes)";
+        return "there is too much: " + usage(*command) + " (" + NEEDS_QUOTES + ")";
     return command->check == nullptr ? "" : command->check(arguments);
 }
 

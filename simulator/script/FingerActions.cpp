@@ -50,7 +50,7 @@ std::string checkText(const Arguments& arguments) {
 
 std::string checkTap(const Arguments& arguments) {
     if (arguments.size() == 2)
-        return placeIn(arguments, 0) ? "" : notPlace(arguments, 0);
+        return placeIn(arguments, 0) ? "" : notTextOrPlace(arguments);
     return checkText(arguments);
 }
 
@@ -65,10 +65,10 @@ std::string checkHold(const Arguments& arguments) {
     if (place && !placeIn(arguments, 0))
         return notPlace(arguments, 0);
     if (!place && arguments.size() == 3)
-        return notPlace(arguments, 0);
+        return notTextOrPlace(arguments);
     const std::size_t time = place ? 2 : 1;
     if (arguments.size() > time && !secondsIn(arguments[time]))
-        return notSeconds(arguments[time]);
+        return place ? notSeconds(arguments[time]) : notSecondsAfterText(arguments[time]);
     return checkText(arguments);
 }
 

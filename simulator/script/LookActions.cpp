@@ -81,9 +81,9 @@ std::string checkWait(const Arguments& arguments) {
         return "";
     const std::size_t limit = limitOf(arguments);
     if (arguments.size() > limit + 1)
-        return "a text of several words needs quotes";
+        return NEEDS_QUOTES;
     if (arguments.size() > limit && !secondsIn(arguments[limit]))
-        return notSeconds(arguments[limit]);
+        return notSecondsAfterText(arguments[limit]);
     return checkText({arguments[limit - 1]});
 }
 

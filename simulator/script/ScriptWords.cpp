@@ -50,6 +50,26 @@ std::string takeQuoted(std::string_view& line, std::string& word) {
     return "a quoted text has no end";
 }
 
+/** Where a text in single quotes ends; npos where the first one is but an apostrophe. */
+std::size_t endOfSingleQuoted(std::string_view line) {
+    std::size_t end = line.find('\'', 1);
+    while (end != std::string_view::npos && end + 1 < line.size() && !isBlank(line[end + 1]))
+        end = line.find('\'', end + 1);
+    return end;
+}
+
+bool beginsSingleQuoted(std::string_view line) {
+    return line.front() == '\'' && endOfSingleQuoted(line) != std::string_view::npos;
+}
+
+/** All in it stands for itself. */
+std::string takeSingleQuoted(std::string_view& line, std::string& word) {
+    const std::size_t end = endOfSingleQuoted(line);
+    word = line.substr(1, end - 1);
+    line.remove_prefix(end + 1);
+    return "";
+}
+
 std::string takePlain(std::string_view& line, std::string& word) {
     while (!line.empty() && !isBlank(line.front())) {
         if (line.front() == '"')
@@ -90,7 +110,11 @@ ScriptWords scriptWords(std::string_view line) {
         if (line.empty() || line.front() == '#')
             break;
         std::string word;
-        result.error = line.front() == '"' ? takeQuoted(line, word) : takePlain(line, word);
+        if (line.front() == '"')
+            result.error = takeQuoted(line, word);
+        else
+            result.error =
+                beginsSingleQuoted(line) ? takeSingleQuoted(line, word) : takePlain(line, word);
         result.words.push_back(std::move(word));
     }
     if (!result.error.empty())

@@ -22,8 +22,10 @@ struct ScriptWords {
 /**
  * @brief Takes a line apart at its blanks.
  *
- * A word in double quotes may hold blanks, and the escapes \" \\ \n and \t. What follows a # at the
- * beginning of a word is a comment.
+ * A word in double quotes may hold blanks, and the escapes \" \\ \n and \t. A word in single quotes
+ * may hold blanks, and all in it stands for itself; only a quote before a blank or the line's end
+ * ends it, so apostrophes in names need no care. What follows a # at the beginning of a word is a
+ * comment.
  */
 ScriptWords scriptWords(std::string_view line);
 

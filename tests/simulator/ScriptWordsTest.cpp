@@ -37,6 +37,19 @@ TEST(ScriptWords, ALineIsTakenApartAtItsBlanks) {
         {R"(type "a \"b\" \\ c\n\td")", {"type", "a \"b\" \\ c\n\td"}},
         {R"(type \n)", {"type", "\\n"}},
         {"tap São", {"tap", "São"}},
+        {"tap 'World clock'", {"tap", "World clock"}},
+        {"wait 'World clock' 3", {"wait", "World clock", "3"}},
+        {"tap 'Done'\t# and go on", {"tap", "Done"}},
+        {R"(type 'a \n "b"')", {"type", R"(a \n "b")"}},
+        {"tap ''", {"tap", ""}},
+        {"tap 'O'Brien's alarm'", {"tap", "O'Brien's alarm"}},
+        {"tap O'Brien", {"tap", "O'Brien"}},
+        {"tap Côte D'Ivoire", {"tap", "Côte D'Ivoire"}},
+        {"tap 's-Hertogenbosch", {"tap", "'s-Hertogenbosch"}},
+        {"tap 'World clock", {"tap", "'World", "clock"}},
+        {"tap James'", {"tap", "James'"}},
+        {"tap '", {"tap", "'"}},
+        {R"(tap "'s-Hertogenbosch'")", {"tap", "'s-Hertogenbosch'"}},
     };
     for (const Line& line : lines) {
         EXPECT_EQ(scriptWords(line.line).words, line.words) << line.line;
