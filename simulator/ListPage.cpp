@@ -5,6 +5,7 @@
 #include <utility>
 
 #include "TimeText.h"
+#include "app_assist/WAccessible.h"
 #include "app_assist/WNaviframeController.h"
 #include "app_assist/WPopupController.h"
 #include "clock/ClockText.h"
@@ -200,7 +201,10 @@ void ListPage::askToRemove(RemovalQuestion question, std::function<void()> remov
 }
 
 void ListPage::writeQuestion(Evas_Object* popup) const {
-    elm_object_part_text_set(popup, "title,text", markupOf(_question.title()).c_str());
+    const std::string title = _question.title();
+    elm_object_part_text_set(popup, "title,text", markupOf(title).c_str());
+    // A popup looks for its title's new words before they are written here.
+    app_assist::setAccessibleName(popup, title);
     const std::string name =
         _question.name.empty() ? "" : "<b>" + markupOf(_question.name) + "</b><br>";
     elm_object_text_set(popup, (name + clockText(_question.textId)).c_str());

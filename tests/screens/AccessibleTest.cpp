@@ -2,7 +2,6 @@
 // bus.
 
 #include <algorithm>
-#include <functional>
 #include <memory>
 
 #include <gmock/gmock.h>
@@ -11,7 +10,6 @@
 #include "screens/CityPickerFixture.h"
 #include "screens/EditorFixture.h"
 #include "support/FocusWalk.h"
-#include "support/LiveLanguage.h"
 #include "support/ScreenReader.h"
 
 namespace {
@@ -354,112 +352,6 @@ TEST_F(AccessibleCityTest, TheClearButtonIsReadWhileThereIsText) {
     EXPECT_THAT(ScreenReader::lines(page()), Not(Contains("push button | Clear")));
     search("kat");
     EXPECT_THAT(ScreenReader::lines(page()), Contains("push button | Clear"));
-}
-
-struct Switch {
-    const char* name;
-    const char* from;
-    const char* to;
-};
-
-/** Another language is chosen while a screen is open: it then reads as if it had been opened so. */
-class AccessibleSwitchTest : public AccessibleTest, public testing::WithParamInterface<Switch> {
-protected:
-    void SetUp() override {
-        AccessibleTest::SetUp();
-        _language = std::make_unique<LiveLanguage>();
-    }
-    void TearDown() override {
-        AccessibleTest::TearDown();
-        _language.reset();
-    }
-    void expectTheSame(const std::function<void()>& open) {
-        _language->choose(GetParam().to);
-        const Lines wanted = opened(open);
-        takeStageDown();
-        _language->choose(GetParam().from);
-        EXPECT_NE(opened(open), wanted);
-        _language->choose(GetParam().to);
-        stage().settle();
-        EXPECT_THAT(read(), testing::UnorderedElementsAreArray(wanted));
-        EXPECT_THAT(wanted, Not(IsEmpty()));
-    }
-    void showRow(int place) {
-        stage().showRow(elm_genlist_nth_item_get(genlist(), static_cast<unsigned>(place)));
-        stage().settle();
-    }
-    void tapRow(int place) {
-        createAlarm();
-        stage().tapRow(elm_genlist_nth_item_get(genlist(), static_cast<unsigned>(place)));
-        stage().settle();
-    }
-
-private:
-    Lines opened(const std::function<void()>& open) {
-        open();
-        stage().settle();
-        return read();
-    }
-    /** Roles and names: the state of a row is known once it has been drawn. */
-    Lines read() {
-        Lines names;
-        for (const ReadThing& thing : ScreenReader::things(popup() ? popup() : page()))
-            names.push_back(thing.role + " | " + thing.name);
-        return names;
-    }
-
-    std::unique_ptr<LiveLanguage> _language;
-};
-
-INSTANTIATE_TEST_SUITE_P(Languages, AccessibleSwitchTest,
-                         testing::Values(Switch{"EnglishToGerman", "en", "de"},
-                                         Switch{"GermanToArabic", "de", "ar"}),
-                         [](const auto& info) { return info.param.name; });
-
-TEST_P(AccessibleSwitchTest, TheEditorsWheelsAndRows) {
-    device().setSetting("db/menu_widget/regionformat_time1224", 1);
-    expectTheSame([this] {
-        createAlarm();
-        pick(18, 25);
-    });
-}
-
-TEST_P(AccessibleSwitchTest, TheEditorsSliderAndSwitches) {
-    expectTheSame([this] {
-        createAlarm();
-        showRow(5);
-    });
-}
-
-TEST_P(AccessibleSwitchTest, TheEditorsField) {
-    expectTheSame([this] {
-        createAlarm();
-        showRow(7);
-    });
-}
-
-TEST_P(AccessibleSwitchTest, TheRepeatScreen) {
-    expectTheSame([this] { tapRow(1); });
-}
-
-TEST_P(AccessibleSwitchTest, TheTypePopup) {
-    expectTheSame([this] { tapRow(2); });
-}
-
-TEST_P(AccessibleSwitchTest, TheDatePopup) {
-    expectTheSame([this] {
-        createAlarm();
-        stage().tap(timePickerRow().getDateTimeObj() ? stage().widgets("Button").front() : nullptr);
-        stage().settle();
-    });
-}
-
-TEST_P(AccessibleSwitchTest, TheDiscardPopup) {
-    expectTheSame([this] {
-        tapRow(5);
-        stage().backKey();
-        stage().settle();
-    });
 }
 
 } // namespace

@@ -14,6 +14,7 @@
 #include "clock/ClockAlarmDbModel.h"
 #include "clock/ClockWorldClockDbModel.h"
 #include "support/FocusWalk.h"
+#include "support/ReadingSwitch.h"
 #include "support/ScreenReader.h"
 #include "support/ScreenTest.h"
 
@@ -45,18 +46,22 @@ protected:
         takeErrors();
         ScreenTest::TearDown();
     }
-    void openAlarms() {
+    /** On Mondays. */
+    static void storeAlarm(int hour, int minute, const std::string& name, bool on) {
         ClockAlarmDbData alarm;
         alarm.leading = 0;
-        alarm.hour = 7;
-        alarm.min = 30;
-        alarm.name = "Gym";
-        // An alarm that rings next would begin with the time until then.
-        alarm.enable = 0;
+        alarm.hour = hour;
+        alarm.min = minute;
+        alarm.name = name;
+        alarm.enable = on ? 1 : 0;
         alarm.repeatWeekly = 2;
         alarm.repeatOnce = 0;
         alarm.id = ClockAlarmDbModel().reserveAlarmId();
         EXPECT_TRUE(ClockAlarmDbModel().insertAlarmData(alarm));
+    }
+    void openAlarms() {
+        // An alarm that rings next would begin with the time until then.
+        storeAlarm(7, 30, "Gym", false);
         stage().push(new AlarmListViewController(THEME));
     }
     void openCities() {
@@ -230,6 +235,68 @@ TEST_F(ReadPagesTest, TheQuickPanelSaysTheVolumeWhileItIsDown) {
     panel->toggle();
     Stage::advance(0.5);
     EXPECT_THAT(said(), testing::IsEmpty());
+}
+
+/** Another language is chosen while a page is open. */
+class ReadPagesSwitchTest : public ReadingSwitch<PagesTest> {
+protected:
+    void tapRow(const std::string& text) {
+        stage().tapText(text);
+        stage().settle();
+    }
+};
+
+INSTANTIATE_TEST_SUITE_P(Languages, ReadPagesSwitchTest, languageChanges(),
+                         [](const auto& info) { return info.param.name; });
+
+TEST_P(ReadPagesSwitchTest, TheAlarmListsRowsSwitchesAndButtons) {
+    storeAlarm(7, 30, "Gym", false);
+    storeAlarm(22, 45, "", true);
+    expectTheSame([this] { stage().push(new AlarmListViewController(THEME)); });
+}
+
+TEST_P(ReadPagesSwitchTest, TheWordsThatThereAreNoAlarms) {
+    expectTheSame([this] { stage().push(new AlarmListViewController(THEME)); });
+}
+
+TEST_P(ReadPagesSwitchTest, TheQuestionBeforeAnAlarmGoes) {
+    storeAlarm(7, 30, "Gym", false);
+    expectTheSame([this] {
+        stage().push(new AlarmListViewController(THEME));
+        const auto time = stage().findText("07:30");
+        ASSERT_TRUE(time);
+        stage().press(time->area.middle().x, time->area.middle().y);
+        Stage::advance(0.8);
+        stage().release();
+    });
+}
+
+TEST_P(ReadPagesSwitchTest, TheWorldClocksRowsAndButtons) {
+    expectTheSame([this] { openCities(); });
+}
+
+TEST_P(ReadPagesSwitchTest, TheWordsThatThereAreNoCities) {
+    expectTheSame([this] { stage().push(new WorldClockViewController(THEME)); });
+}
+
+TEST_P(ReadPagesSwitchTest, TheQuestionBeforeACityGoes) {
+    expectTheSame([this] {
+        openCities();
+        tapRow("14:26");
+    });
+}
+
+TEST_P(ReadPagesSwitchTest, TheQuickPanelsVolume) {
+    device().setVolume(SOUND_TYPE_ALARM, 7);
+    language().choose("en");
+    QuickPanel panel(stage().window(), THEME, [](bool) {});
+    panel.toggle();
+    Stage::advance(0.5);
+    language().choose("de");
+    stage().settle();
+    EXPECT_THAT(ScreenReader::announced(stage().window()), ElementsAre("Weckerlautstärke, 7 / 15"));
+    panel.toggle();
+    stage().settle();
 }
 
 } // namespace
