@@ -16,7 +16,8 @@ namespace simulator {
 
 namespace {
 constexpr double TOAST_SECONDS = 3.0;
-}
+constexpr const char* TEXT = "toast.text";
+} // namespace
 
 ToastView::ToastView(Evas_Object* window, const std::string& theme)
     : _layout(elm_layout_add(window)) {
@@ -45,22 +46,33 @@ void ToastView::_toastCb(const char* message, void* data) {
 
 void ToastView::post(const std::string& text) {
     // Who does the same again wants to read it once.
-    if (_timer && text == (_waiting.empty() ? _shown : _waiting.back()))
+    if (_timer && text == (_waiting.empty() ? _shown : _waiting.back().text))
         return;
-    _waiting.push_back(text);
+    _waiting.push_back({text, elm_object_mirrored_get(_layout) != EINA_FALSE});
     if (!_timer)
         showNext();
 }
 
 void ToastView::showNext() {
-    _shown = std::move(_waiting.front());
+    const bool rightToLeft = _waiting.front().rightToLeft;
+    _shown = std::move(_waiting.front().text);
     _waiting.pop_front();
     char* markup = elm_entry_utf8_to_markup(_shown.c_str());
-    elm_object_part_text_set(_layout, "toast.text", markup);
+    elm_object_part_text_set(_layout, TEXT, markup);
     std::free(markup);
+    direct(rightToLeft);
     app_assist::announce(_layout, _shown);
     elm_object_signal_emit(_layout, "toast,show", "simulator");
     _timer.reset(ecore_timer_add(TOAST_SECONDS, _timeOverCb, this));
+}
+
+/** The first letters may be those of a name in another script. */
+void ToastView::direct(bool rightToLeft) {
+    // The toolkit hands its text out to be read only.
+    auto* text =
+        const_cast<Evas_Object*>(edje_object_part_object_get(elm_layout_edje_get(_layout), TEXT));
+    evas_object_paragraph_direction_set(text, rightToLeft ? EVAS_BIDI_DIRECTION_RTL
+                                                          : EVAS_BIDI_DIRECTION_LTR);
 }
 
 Eina_Bool ToastView::_timeOverCb(void* data) {

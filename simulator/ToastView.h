@@ -27,20 +27,26 @@ public:
     ToastView& operator=(const ToastView&) = delete;
 
     /** @brief Shows a text, or keeps it until the texts before it have been shown.
-     * One that reads as the one before is shown once. */
+     * One that reads as the one before is shown once. It stays in the language, and runs in the
+     * direction, in which it was posted. */
     void post(const std::string& text);
 
 private:
     struct TimerDeleter {
         void operator()(Ecore_Timer* timer) const { ecore_timer_del(timer); }
     };
+    struct Toast {
+        std::string text;
+        bool rightToLeft = false;
+    };
     static void _toastCb(const char* message, void* data);
     static Eina_Bool _timeOverCb(void* data);
     void showNext();
+    void direct(bool rightToLeft);
 
     Evas_Object* _layout;
     std::string _shown;
-    std::deque<std::string> _waiting;
+    std::deque<Toast> _waiting;
     std::unique_ptr<Ecore_Timer, TimerDeleter> _timer;
 };
 

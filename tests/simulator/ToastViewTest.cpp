@@ -4,7 +4,11 @@
 
 #include <string>
 
+#include <gmock/gmock.h>
+
+#include "support/LiveLanguage.h"
 #include "support/ScreenTest.h"
+#include "support/TextFaults.h"
 
 using simulator::ToastView;
 
@@ -15,7 +19,31 @@ const std::string THEME = CLOCK_RESOURCE_DIR "/edje/simulator.edj";
 class ToastViewTest : public ScreenTest {
 protected:
     bool shows(const std::string& text) { return stage().shows(text); }
+    /** Whether the first letter of a toast of one line stands before, that is right of, its last.
+     */
+    bool runsToTheLeft(const std::string& text) {
+        const auto found = stage().findText(text);
+        if (!found) {
+            ADD_FAILURE() << text << " is not shown";
+            return false;
+        }
+        Evas_Textblock_Cursor* cursor = evas_object_textblock_cursor_new(found->object);
+        const auto place = [cursor] {
+            int x = 0;
+            evas_textblock_cursor_char_geometry_get(cursor, &x, nullptr, nullptr, nullptr);
+            return x;
+        };
+        evas_textblock_cursor_paragraph_first(cursor);
+        const int first = place();
+        evas_textblock_cursor_line_char_last(cursor);
+        const int last = place();
+        evas_textblock_cursor_free(cursor);
+        return first > last;
+    }
 };
+
+constexpr const char* ARABIC = "Oslo مدينة";
+constexpr const char* ENGLISH = "يوغا is set";
 
 } // namespace
 
@@ -99,4 +127,39 @@ TEST_F(ToastViewTest, aViewThatGoesWithAToastLeavesNothingBehind) {
 TEST_F(ToastViewTest, aThemeWithoutAToastIsLogged) {
     const ToastView toasts(stage().window(), "/nowhere.edj");
     expectLog("'/nowhere.edj' has no toast");
+}
+
+TEST_F(ToastViewTest, aToastRunsAsItsLanguageWhateverItsFirstLettersAre) {
+    LiveLanguage language;
+    language.choose("ar");
+    ToastView toasts(stage().window(), THEME);
+    toasts.post(ARABIC);
+    Stage::advance(1);
+    EXPECT_TRUE(runsToTheLeft(ARABIC));
+    stage().screenshot("toast-right-to-left");
+    Stage::advance(3);
+    language.choose("en");
+    toasts.post(ENGLISH);
+    Stage::advance(1);
+    EXPECT_FALSE(runsToTheLeft(ENGLISH));
+}
+
+TEST_F(ToastViewTest, aToastStaysAsItWasPostedWhileTheLanguageChanges) {
+    LiveLanguage language;
+    language.choose("ar");
+    ToastView toasts(stage().window(), THEME);
+    toasts.post(ARABIC);
+    toasts.post("Rome مدينة");
+    Stage::advance(1);
+    language.choose("en");
+    toasts.post(ENGLISH);
+    stage().settle(1);
+    EXPECT_TRUE(runsToTheLeft(ARABIC));
+    EXPECT_THAT(faultsOf(stage().texts()), testing::IsEmpty());
+    stage().screenshot("toast-right-to-left-in-english");
+    Stage::advance(2);
+    EXPECT_TRUE(runsToTheLeft("Rome مدينة")) << "it waited";
+    Stage::advance(3);
+    EXPECT_FALSE(runsToTheLeft(ENGLISH));
+    EXPECT_THAT(faultsOf(stage().texts()), testing::IsEmpty());
 }
