@@ -166,6 +166,8 @@ void FocusNavigator::_rootDeletedCb(void* data, const Efl_Event* event) {
     if (std::find(navigators().begin(), navigators().end(), self) == navigators().end())
         return;
     self->_memories.erase(root);
+    if (self->_pressedRoot == root)
+        self->endPress();
     if (self->_root == root) {
         self->_root = nullptr;
         self->_turning = false;
@@ -208,7 +210,7 @@ void FocusNavigator::_mouseUpCb(void* data, Evas*, Evas_Object*, void* info) {
     auto& event = *static_cast<Evas_Event_Mouse_Up*>(info);
     if (event.button == MIDDLE_BUTTON) {
         keepFromBelow(event);
-        if (self->endPress())
+        if (self->endPress() && self->isStillPressed())
             self->handle(FocusInput::Press);
     } else {
         self->touched(event.canvas.x, event.canvas.y);
@@ -222,6 +224,8 @@ bool FocusNavigator::startPress() {
     const auto thing = found(FocusView(_root));
     if (!thing || thing->kind != FocusKind::Row)
         return false;
+    _pressedRoot = _root;
+    _pressed = *thing;
     _press = ecore_timer_add(elm_config_longpress_timeout_get(), _heldCb, this);
     return true;
 }
@@ -236,8 +240,17 @@ bool FocusNavigator::endPress() {
 Eina_Bool FocusNavigator::_heldCb(void* data) {
     auto* self = static_cast<FocusNavigator*>(data);
     self->_press = nullptr;
-    self->handle(FocusInput::Hold);
+    if (self->isStillPressed())
+        self->handle(FocusInput::Hold);
     return ECORE_CALLBACK_CANCEL;
+}
+
+/** While the bezel is pressed its page may go, and the focus may move on. */
+bool FocusNavigator::isStillPressed() {
+    if (!enterPage() || _root != _pressedRoot)
+        return false;
+    const auto thing = found(FocusView(_root));
+    return thing && isSame(*thing, _pressed);
 }
 
 /** What is turned by hand is what the bezel turns next. */

@@ -77,6 +77,8 @@ private:
     bool startPress();
     /** The bezel is let go. @return True when a row was pressed and not held. */
     bool endPress();
+    /** Whether the row that was pressed has the focus still. */
+    bool isStillPressed();
     void touched(int x, int y);
     void lead(bool keys);
     void hideRings() const;
@@ -88,6 +90,8 @@ private:
     std::map<Evas_Object*, Memory> _memories;
     Ecore_Idle_Enterer* _idle = nullptr; ///< While keys lead.
     Ecore_Timer* _press = nullptr;       ///< While the bezel is pressed on a row.
+    Evas_Object* _pressedRoot = nullptr; ///< Where it was pressed last.
+    FocusThing _pressed;                 ///< The row that it was pressed on.
     bool _turning = false;
     bool _returns = false;    ///< The page has come, but does not yet show what has the focus.
     bool _endsTyping = false; ///< Return has just gone to a field.

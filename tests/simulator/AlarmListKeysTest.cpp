@@ -24,12 +24,30 @@ protected:
         for (const std::string& name : names)
             stage().keySettled(name);
     }
-    void holdBezel() {
+    void bezelDown() {
         evas_event_feed_mouse_move(stage().canvas(), 180, 180, ++_stamp, nullptr);
         evas_event_feed_mouse_down(stage().canvas(), 2, EVAS_BUTTON_NONE, ++_stamp, nullptr);
-        Stage::advance(0.8);
+        Stage::frames(1);
+    }
+    void bezelUp() {
         evas_event_feed_mouse_up(stage().canvas(), 2, EVAS_BUTTON_NONE, ++_stamp, nullptr);
         stage().settle();
+    }
+    void holdBezel() {
+        bezelDown();
+        Stage::advance(0.8);
+        bezelUp();
+    }
+    /** A page above the list, with the focus on a row. */
+    void openAlarm() {
+        stage().pressBezel();
+        EXPECT_EQ(pages(), 2U);
+        for (int step = 0; step < 9; ++step) {
+            stage().bezel(1);
+            if (theRinged(stage()).type == "Elm_Genlist")
+                return;
+        }
+        ADD_FAILURE() << "the bezel reaches no row";
     }
     bool asks() { return stage().shows("Remove"); }
     /** What is read of the switches and rows, with " (on)" where it is checked. */
@@ -133,6 +151,61 @@ TEST_F(AlarmListKeysTest, aBezelThatIsHeldOnASwitchFlipsItOnce) {
     holdBezel();
     EXPECT_FALSE(asks());
     EXPECT_EQ(stored(alarm).enable, 0);
+}
+
+TEST_F(AlarmListKeysTest, aBezelThatIsHeldWhileItsPageGoesMeansNoOtherRow) {
+    add(10, 30, true, WEDNESDAY);
+    openPage();
+    stage().bezel(1);
+    openAlarm();
+    bezelDown();
+    stage().backKey();
+    stage().settle();
+    ASSERT_EQ(pages(), 1U);
+    Stage::advance(0.8);
+    EXPECT_FALSE(asks()) << "the row of the list was not what was pressed";
+    bezelUp();
+    EXPECT_EQ(pages(), 1U);
+    takeErrors();
+}
+
+TEST_F(AlarmListKeysTest, aBezelThatIsLetGoWhenItsPageHasGoneMeansNoOtherRow) {
+    add(10, 30, true, WEDNESDAY);
+    openPage();
+    stage().bezel(1);
+    openAlarm();
+    bezelDown();
+    stage().backKey();
+    Stage::frames(2);
+    bezelUp();
+    EXPECT_EQ(pages(), 1U) << "the row of the list was pressed";
+    takeErrors();
+}
+
+TEST_F(AlarmListKeysTest, aBezelThatIsTurnedWhileItIsPressedMeansNoOtherRow) {
+    add(10, 30, true, WEDNESDAY);
+    add(10, 45, true, WEDNESDAY);
+    openPage();
+    stage().bezel(1);
+    bezelDown();
+    stage().bezel(2);
+    EXPECT_EQ(theRinged(stage()).type, "Elm_Genlist");
+    Stage::advance(0.8);
+    EXPECT_FALSE(asks());
+    bezelUp();
+    EXPECT_EQ(pages(), 1U);
+    holdBezel();
+    EXPECT_TRUE(asks()) << "it can be held where it is now";
+}
+
+TEST_F(AlarmListKeysTest, aBezelThatIsHeldWhileTheWindowGoesMeansNothing) {
+    add(10, 30, true, WEDNESDAY);
+    openPage();
+    stage().bezel(1);
+    bezelDown();
+    takeStageDown();
+    Stage::advance(0.8);
+    EXPECT_THAT(takeErrors(), IsEmpty());
 }
 
 TEST_F(AlarmListKeysTest, everythingHasANameForScreenReaders) {
