@@ -20,6 +20,8 @@ namespace host {
 
 namespace {
 
+constexpr const char* TOO_LONG = "the answer is too long";
+
 /** Never destroyed: at the process's end the toolkit is gone before statics are. */
 std::unique_ptr<FaceAgent>& ownAgent() {
     static auto* const agent = new std::unique_ptr<FaceAgent>;
@@ -112,7 +114,7 @@ void FaceCaller::doNext(const std::string& message) {
         words.emplace_back(text);
     _working = true;
     Work work = doRequest(words, [this](const Words& answer) {
-        _toSend += base::encodeMessage(answer).value_or("");
+        _toSend += base::encodeMessage(answer).value_or(*base::encodeMessage({TOO_LONG}));
         send();
         _working = false;
         // Not here: the work that has answered is in the middle of it.
