@@ -245,7 +245,8 @@ TEST_F(DeviceRemoteTest, TheEndOfListeningHangsUpAndLeavesNothing) {
 
 TEST_F(DeviceRemoteTest, WhoListensAnewIsThereOnce) {
     ASSERT_EQ(device_remote_listen(folder.path().c_str()), 0);
-    EXPECT_THAT(namesIn(folder.path()), ElementsAre(testing::Gt(own))) << "the last one is in front";
+    EXPECT_THAT(namesIn(folder.path()), ElementsAre(testing::Gt(own)))
+        << "the last one is in front";
 }
 
 TEST_F(DeviceRemoteTest, NamesSortByTimeHoweverLongTheComputerRuns) {
