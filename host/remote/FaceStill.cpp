@@ -2,6 +2,8 @@
 
 #include <utility>
 
+#include <Eo.h>
+
 #include "Animations.h"
 #include "FaceWindow.h"
 
@@ -34,12 +36,15 @@ void FaceStill::follow(Ecore_Evas* window) {
     Evas* canvas = window ? ecore_evas_get(window) : nullptr;
     if (canvas == _canvas)
         return;
-    // A canvas that has gone took its callbacks along; this one is never followed beyond a look.
-    if (_canvas)
+    if (_canvas) {
         evas_event_callback_del_full(_canvas, EVAS_CALLBACK_RENDER_POST, _renderedCb, this);
+        efl_wref_del(_canvas, &_canvas);
+    }
     _canvas = canvas;
-    if (_canvas)
+    if (_canvas) {
         evas_event_callback_add(_canvas, EVAS_CALLBACK_RENDER_POST, _renderedCb, this);
+        efl_wref_add(_canvas, &_canvas);
+    }
 }
 
 void FaceStill::_renderedCb(void* data, Evas* /*canvas*/, void* info) {

@@ -42,7 +42,7 @@ private:
     double _end;
     Done _done;
     Ecore_Timer* _timer;
-    Evas* _canvas = nullptr;
+    Evas* _canvas = nullptr; ///< Null when it has gone, too.
     Turns _seen;
     int _rendered = 0;
     Eina_Rectangle _changed{};

@@ -166,8 +166,6 @@ void FocusNavigator::_rootDeletedCb(void* data, const Efl_Event* event) {
     if (std::find(navigators().begin(), navigators().end(), self) == navigators().end())
         return;
     self->_memories.erase(root);
-    if (self->_pressedRoot == root)
-        self->endPress();
     if (self->_root == root) {
         self->_root = nullptr;
         self->_turning = false;

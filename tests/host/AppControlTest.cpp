@@ -13,9 +13,12 @@
 #include <sys/resource.h>
 #include <unistd.h>
 
+#include "FaceConnection.h"
 #include "Helper.h"
+#include "base/LocalSocket.h"
 #include "device/app_control.h"
 #include "device_app.h"
+#include "device_remote.h"
 
 namespace fs = std::filesystem;
 
@@ -538,4 +541,41 @@ TEST_F(AppControl, AProgramThatAPersonStartedHasNoRequest) {
     EXPECT_EQ(
         app_control_reply_to_launch_request(reply.get(), reply.get(), APP_CONTROL_RESULT_SUCCEEDED),
         APP_CONTROL_ERROR_INVALID_PARAMETER);
+}
+
+TEST_F(AppControl, TheFaceOfAnApplicationThatWasKilledGoes) {
+    const std::string faces = folder / "faces";
+    fs::create_directory(faces);
+    ASSERT_EQ(device_remote_listen(faces.c_str()), 0);
+    start("stay");
+    const std::string process = std::to_string(reportedProcess());
+    // What a killed process leaves, and that of another one whose number ends so.
+    writeFile(faces + "/2-" + process, "");
+    writeFile(faces + "/2-1" + process, "");
+    kill(std::atoi(process.c_str()), SIGKILL);
+    ASSERT_TRUE(isAnswered());
+    EXPECT_FALSE(fs::exists(faces + "/2-" + process));
+    EXPECT_TRUE(fs::exists(faces + "/2-1" + process));
+    device_remote_listen(nullptr);
+    unsetenv("CLOCK_FACE_DIR");
+}
+
+TEST_F(AppControl, WhoUsesTheFaceFromOutsideIsToldWhatWasStarted) {
+    const std::string faces = folder / "faces";
+    fs::create_directory(faces);
+    ASSERT_EQ(device_remote_listen(faces.c_str()), 0);
+    const fs::directory_iterator face(faces);
+    FaceConnection caller(base::connectTo(faces, begin(face)->path().filename()));
+    caller.ask({{"launches"}});
+    EXPECT_THAT(caller.hear(), testing::Optional(ElementsAre("")));
+    start("stay");
+    const pid_t process = reportedProcess();
+    caller.ask({{"launches"}});
+    EXPECT_THAT(caller.hear(), testing::Optional(ElementsAre("", std::to_string(process))));
+    kill(process, SIGKILL);
+    ASSERT_TRUE(isAnswered());
+    caller.ask({{"launches"}});
+    EXPECT_THAT(caller.hear(), testing::Optional(ElementsAre("")));
+    device_remote_listen(nullptr);
+    unsetenv("CLOCK_FACE_DIR");
 }

@@ -2,14 +2,10 @@
 
 #include "device_remote.h"
 
-#include <array>
 #include <cerrno>
 #include <cstdlib>
 #include <cstring>
 #include <filesystem>
-#include <functional>
-#include <memory>
-#include <optional>
 #include <string>
 #include <utility>
 #include <vector>
@@ -22,6 +18,8 @@
 
 #include "base/LocalSocket.h"
 #include "base/Message.h"
+#include "device/vconf.h"
+#include "host/FaceConnection.h"
 #include "host/Helper.h"
 
 namespace fs = std::filesystem;
@@ -46,58 +44,6 @@ Words namesIn(const std::string& folder) {
     return names;
 }
 
-/** One end of a connection, and the words that have arrived there. */
-class Connection {
-public:
-    explicit Connection(int channel) : _channel(channel) {}
-    ~Connection() { hangUp(); }
-    Connection(const Connection&) = delete;
-    Connection& operator=(const Connection&) = delete;
-
-    void hangUp() {
-        if (_channel >= 0)
-            close(std::exchange(_channel, -1));
-    }
-    void sendBytes(const std::string& bytes) const {
-        EXPECT_EQ(send(_channel, bytes.data(), bytes.size(), MSG_NOSIGNAL),
-                  static_cast<ssize_t>(bytes.size()));
-    }
-    void ask(const std::vector<Words>& requests) const {
-        std::string bytes;
-        for (const Words& request : requests)
-            bytes += *base::encodeMessage(request);
-        sendBytes(bytes);
-    }
-    /** The next words, for which the main loop runs; nothing when none come. */
-    std::optional<Words> hear(double seconds = 5) {
-        std::optional<std::string> message;
-        iterateUntil([&] { return (message = _reader.next()).has_value() || !read(); }, seconds);
-        if (!message)
-            return std::nullopt;
-        Words words;
-        for (const auto text : base::textsOfMessage(*message))
-            words.emplace_back(text);
-        return words;
-    }
-    /** Whether the other end hangs up. */
-    bool isLeft() {
-        return iterateUntil([this] { return !read(); });
-    }
-
-private:
-    /** @return False when the other end has gone. */
-    bool read() {
-        std::array<char, 64UL * 1024> bytes{};
-        const ssize_t size = recv(_channel, bytes.data(), bytes.size(), MSG_DONTWAIT);
-        if (size > 0)
-            _reader.add({bytes.data(), static_cast<std::size_t>(size)});
-        return size > 0 || (size < 0 && errno == EAGAIN);
-    }
-
-    int _channel;
-    base::MessageReader _reader;
-};
-
 /** Another application of the device. */
 class OtherFace {
 public:
@@ -118,7 +64,7 @@ public:
     /** What it was asked for, once. */
     Words asked() const {
         const int caller = accept4(_channel, nullptr, nullptr, SOCK_CLOEXEC);
-        return caller < 0 ? Words{} : Connection(caller).hear().value_or(Words{});
+        return caller < 0 ? Words{} : FaceConnection(caller).hear().value_or(Words{});
     }
 
 private:
@@ -144,7 +90,7 @@ protected:
         own = names.empty() ? "" : names.front();
         device_remote_set_request_callback(_requestCb, this);
     }
-    Connection connect() { return Connection(base::connectTo(folder.path(), own)); }
+    FaceConnection connect() { return FaceConnection(base::connectTo(folder.path(), own)); }
     static int send(const Words& words, int (*how)(const char* const*, int) = device_remote_send) {
         std::vector<const char*> pointers;
         for (const std::string& word : words)
@@ -171,9 +117,12 @@ private:
 } // namespace
 
 TEST_F(DeviceRemoteTest, RequestsThatComeAtOnceAreDoneOneAfterTheOther) {
-    Connection caller = connect();
+    FaceConnection caller = connect();
     answer = "=seven";
-    caller.ask({{"still", "0.1"}, {"get"}, {"still", "0.1"}, {"get"}});
+    caller.ask({{"still", "0.1"}});
+    iterateFor(0.02);
+    // While the first one is being done.
+    caller.ask({{"get"}, {"still", "0.1"}, {"get"}});
     EXPECT_EQ(caller.hear(), Words{"no window is shown"});
     EXPECT_EQ(caller.hear(), (Words{"", "seven"}));
     EXPECT_EQ(caller.hear(), Words{"no window is shown"});
@@ -181,7 +130,7 @@ TEST_F(DeviceRemoteTest, RequestsThatComeAtOnceAreDoneOneAfterTheOther) {
 }
 
 TEST_F(DeviceRemoteTest, ARequestMayComeInPieces) {
-    Connection caller = connect();
+    FaceConnection caller = connect();
     const std::string bytes = *base::encodeMessage({"settings"});
     for (const char byte : bytes) {
         caller.sendBytes(std::string(1, byte));
@@ -191,7 +140,7 @@ TEST_F(DeviceRemoteTest, ARequestMayComeInPieces) {
 }
 
 TEST_F(DeviceRemoteTest, ALargeAnswerArrivesWhole) {
-    Connection caller = connect();
+    FaceConnection caller = connect();
     answer = "=";
     for (int i = 0; answer.size() < 900000; ++i)
         answer += std::to_string(i) + " ";
@@ -202,14 +151,14 @@ TEST_F(DeviceRemoteTest, ALargeAnswerArrivesWhole) {
 }
 
 TEST_F(DeviceRemoteTest, AnAnswerThatIsTooLargeIsToldOf) {
-    Connection caller = connect();
+    FaceConnection caller = connect();
     answer = "=" + std::string(base::MESSAGE_LIMIT, 'x');
     caller.ask({{"get"}});
     EXPECT_EQ(caller.hear(), Words{"the answer is too long"});
 }
 
 TEST_F(DeviceRemoteTest, WhoAnnouncesTooMuchIsLeft) {
-    Connection caller = connect();
+    FaceConnection caller = connect();
     caller.sendBytes(std::string(64, '\xFF'));
     EXPECT_TRUE(caller.isLeft());
 }
@@ -221,20 +170,20 @@ TEST_F(DeviceRemoteTest, WhoHangsUpIsForgotten) {
     };
     for (const Words& request : {Words{"settings"}, Words{"still", "60"}, Words{"get"}}) {
         answer = "=" + std::string(900000, 'x');
-        Connection caller = connect();
+        FaceConnection caller = connect();
         caller.ask({request});
         iterateFor(0.05);
         caller.hangUp();
         EXPECT_TRUE(iterateUntil(isAsBefore)) << request.front();
     }
-    Connection next = connect();
+    FaceConnection next = connect();
     next.ask({{"settings"}});
     EXPECT_EQ(next.hear(), Words{""});
 }
 
 TEST_F(DeviceRemoteTest, TheEndOfListeningHangsUpAndLeavesNothing) {
     const std::size_t before = openDescriptors();
-    Connection caller = connect();
+    FaceConnection caller = connect();
     caller.ask({{"still", "60"}});
     iterateFor(0.05);
     device_remote_listen(nullptr);
@@ -264,8 +213,30 @@ TEST_F(DeviceRemoteTest, AFolderThatIsNotThereIsRefused) {
     EXPECT_EQ(device_remote_listen("/nowhere/at/all"), -ENOENT);
 }
 
+TEST_F(DeviceRemoteTest, AnApplicationThatCannotListenSaysSoAndGoesOn) {
+    setenv("CLOCK_RESOURCE_DIR", CLOCK_RESOURCE_DIR, 1);
+    setenv("CLOCK_FACE_DIR", "/nowhere/at/all", 1);
+    EXPECT_THAT(standardErrorOf([] { EXPECT_EQ(std::system(CLOCK_DEVICE_CLOCK " >&2"), 0); }),
+                testing::HasSubstr("Nobody can use this face from outside, in /nowhere/at/all: "
+                                   "No such file or directory"));
+    setenv("CLOCK_FACE_DIR", "", 1);
+    EXPECT_THAT(standardErrorOf([] { EXPECT_EQ(std::system(CLOCK_DEVICE_CLOCK " >&2"), 0); }),
+                testing::Not(testing::HasSubstr("Nobody can use this face")));
+}
+
+TEST_F(DeviceRemoteTest, SettingsOfOtherProcessesArriveBeforeTheAnswer) {
+    int changes = 0;
+    vconf_notify_key_changed(
+        "db/setting/motion", [](keynode_t*, void* count) { ++*static_cast<int*>(count); },
+        &changes);
+    ASSERT_EQ(waitFor(startHelper({"set-int", "db/setting/motion", "0"})), 0);
+    EXPECT_EQ(changes, 0);
+    EXPECT_EQ(send({"settings"}), 0);
+    EXPECT_EQ(changes, 1);
+}
+
 TEST_F(DeviceRemoteTest, WhatTheProgramSaysIsPassedOn) {
-    Connection caller = connect();
+    FaceConnection caller = connect();
     caller.ask({{"set", "mood", "good"}, {""}, {}});
     EXPECT_EQ(caller.hear(), Words{""}) << "nothing was wrong";
     EXPECT_EQ(caller.hear(), Words{""});
@@ -280,7 +251,7 @@ TEST_F(DeviceRemoteTest, WhatTheProgramSaysIsPassedOn) {
 }
 
 TEST_F(DeviceRemoteTest, WithoutAWindowThereIsNothingToUse) {
-    Connection caller = connect();
+    FaceConnection caller = connect();
     for (const Words& request :
          {Words{"pointer", "down", "1", "2", "3"}, Words{"bezel", "1", "2", "3"},
           Words{"key", "Return", "", "down"}, Words{"texts"}, Words{"wheels"}, Words{"typing"},

@@ -1,7 +1,6 @@
 // Pages on a naviframe: their life, their ways out, and the back key.
 
 #include <algorithm>
-#include <cstdarg>
 #include <functional>
 #include <string>
 
@@ -10,6 +9,7 @@
 #include "clock/ClockEventListener.h"
 #include "screens/FrameworkProbe.h"
 #include "support/ScreenTest.h"
+#include "support/ToolkitErrors.h"
 
 using app_assist::WNaviframeController;
 using app_assist::WUiTimer;
@@ -18,26 +18,6 @@ namespace {
 
 /** Time enough for a page to come or go. */
 constexpr double TRANSITION = 1;
-
-/** Counts what the toolkit complains about while it lives. */
-class ToolkitErrors {
-public:
-    ToolkitErrors() { eina_log_print_cb_set(logCb, this); }
-    ~ToolkitErrors() { eina_log_print_cb_set(eina_log_print_cb_stderr, nullptr); }
-    ToolkitErrors(const ToolkitErrors&) = delete;
-    ToolkitErrors& operator=(const ToolkitErrors&) = delete;
-    int count() const { return _count; }
-
-private:
-    static void logCb(const Eina_Log_Domain* /*domain*/, Eina_Log_Level level, const char* /*file*/,
-                      const char* /*function*/, int /*line*/, const char* /*format*/, void* data,
-                      va_list /*arguments*/) {
-        if (level <= EINA_LOG_LEVEL_ERR) {
-            ++static_cast<ToolkitErrors*>(data)->_count;
-        }
-    }
-    int _count = 0;
-};
 
 class FrameworkPageTest : public ScreenTest {
 protected:

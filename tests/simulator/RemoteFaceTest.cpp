@@ -1,7 +1,9 @@
 // The face as scripts use it: real requests over a real socket, and real screens.
 
+#include <algorithm>
 #include <atomic>
 #include <filesystem>
+#include <fstream>
 #include <functional>
 #include <memory>
 #include <optional>
@@ -15,13 +17,17 @@
 #include <unistd.h>
 
 #include "AlarmEditViewController.h"
+#include "base/LocalSocket.h"
+#include "clock/ClockEventListener.h"
 #include "device_remote.h"
+#include "device_settings.h"
 #include "script/Commands.h"
 #include "script/FaceChannel.h"
 #include "script/RunningWatch.h"
 #include "script/ScriptRun.h"
 #include "script/ScriptWords.h"
 #include "support/ScreenTest.h"
+#include "support/ToolkitErrors.h"
 
 using simulator::Reply;
 using simulator::Request;
@@ -65,6 +71,7 @@ protected:
         _folder = mkdtemp(path.data());
         ASSERT_EQ(device_remote_listen(_folder.c_str()), 0);
         _watch = std::make_unique<TestedWatch>(_folder);
+        _canvas = stage().canvas();
         Stage::advance(0.5);
     }
     void TearDown() override {
@@ -150,6 +157,18 @@ protected:
         return {left, right};
     }
 
+    const std::string& folder() const { return _folder; }
+    bool hasKeys() const {
+        return ecore_evas_focus_get(ecore_evas_ecore_evas_get(_canvas)) != EINA_FALSE;
+    }
+    /** The names of the wheels that a script sees. */
+    std::vector<std::string> wheels() {
+        std::vector<std::string> names;
+        const auto values = ask({"wheels"}).values;
+        for (std::size_t at = 0; at + 8 < values.size(); at += 9 + std::stoul(values[at + 8]))
+            names.push_back(values[at]);
+        return names;
+    }
     std::vector<std::string> shownTexts() {
         std::vector<std::string> all;
         for (const FoundText& found : stage().texts())
@@ -160,6 +179,7 @@ protected:
 private:
     std::string _folder;
     std::unique_ptr<TestedWatch> _watch;
+    Evas* _canvas = nullptr;
 };
 
 } // namespace
@@ -246,4 +266,166 @@ TEST_F(RemoteFaceTest, fingersKeysAndTheBezelReachTheFace) {
     Stage::frames(5);
     EXPECT_EQ(turned, 1);
     evas_object_del(entry);
+}
+
+TEST_F(RemoteFaceTest, theWheelsThatCanBeTurnedAreTold) {
+    openEditor();
+    EXPECT_THAT(wheels(), testing::ElementsAre("hour", "minute"));
+    scrollTo(600);
+    EXPECT_THAT(wheels(), testing::IsEmpty()) << "they are out of sight";
+    scrollTo(0);
+    device().setSetting(DEVICE_SETTING_TIME_FORM, 1);
+    ClockEventListener::raise(ClockEventListener::SETTINGS_CHANGED);
+    stage().settle();
+    EXPECT_THAT(wheels(), testing::ElementsAre("hour", "minute", "half"));
+}
+
+TEST_F(RemoteFaceTest, aFieldThatIsOutOfSightTakesNothing) {
+    Evas_Object* entry = elm_entry_add(stage().window());
+    evas_object_resize(entry, Stage::SIZE, Stage::SIZE);
+    evas_object_show(entry);
+    elm_object_focus_set(entry, EINA_TRUE);
+    Stage::advance(0.3);
+    EXPECT_EQ(ask({"typing"}).values, std::vector<std::string>{"yes"});
+    evas_object_move(entry, 0, 2 * Stage::SIZE);
+    Stage::frames(2);
+    EXPECT_EQ(ask({"typing"}).values, std::vector<std::string>{"no"});
+    evas_object_del(entry);
+}
+
+TEST_F(RemoteFaceTest, aFingerComesGoesDownAndUpAndIsNowhereThen) {
+    Evas_Object* shape = evas_object_rectangle_add(stage().canvas());
+    evas_object_resize(shape, Stage::SIZE, Stage::SIZE);
+    evas_object_layer_set(shape, EVAS_LAYER_MAX - 1);
+    evas_object_show(shape);
+    Stage::frames(2);
+    std::vector<std::string> seen;
+    std::vector<unsigned> times;
+    struct Notes {
+        std::vector<std::string>& seen;
+        std::vector<unsigned>& times;
+    } notes{seen, times};
+    evas_object_event_callback_add(
+        shape, EVAS_CALLBACK_MOUSE_IN,
+        [](void* data, Evas*, Evas_Object*, void*) {
+            static_cast<Notes*>(data)->seen.emplace_back("in");
+        },
+        &notes);
+    evas_object_event_callback_add(
+        shape, EVAS_CALLBACK_MOUSE_DOWN,
+        [](void* data, Evas*, Evas_Object*, void* info) {
+            static_cast<Notes*>(data)->seen.emplace_back("down");
+            static_cast<Notes*>(data)->times.push_back(
+                static_cast<Evas_Event_Mouse_Down*>(info)->timestamp);
+        },
+        &notes);
+    evas_object_event_callback_add(
+        shape, EVAS_CALLBACK_MOUSE_UP,
+        [](void* data, Evas*, Evas_Object*, void* info) {
+            static_cast<Notes*>(data)->seen.emplace_back("up");
+            static_cast<Notes*>(data)->times.push_back(
+                static_cast<Evas_Event_Mouse_Up*>(info)->timestamp);
+        },
+        &notes);
+    evas_object_event_callback_add(
+        shape, EVAS_CALLBACK_MOUSE_OUT,
+        [](void* data, Evas*, Evas_Object*, void*) {
+            static_cast<Notes*>(data)->seen.emplace_back("out");
+        },
+        &notes);
+    EXPECT_EQ(ask({"pointer", "move", "0", "90", "90"}).problem, "");
+    Stage::frames(2);
+    seen.clear();
+    // At the same instant.
+    for (const char* press : {"down", "up", "down", "up"}) {
+        const char* words[] = {"pointer", press, "1", "100", "100"};
+        EXPECT_EQ(device_remote_send(words, 5), 0);
+    }
+    Stage::frames(2);
+    EXPECT_THAT(seen, testing::ElementsAre("down", "up", "out", "in", "down", "up", "out"));
+    EXPECT_THAT(std::adjacent_find(times.begin(), times.end(), std::greater_equal<>()),
+                testing::Eq(times.end()))
+        << testing::PrintToString(times);
+    evas_object_del(shape);
+}
+
+TEST_F(RemoteFaceTest, aRequestTurnsTheBezelByOneDetent) {
+    std::vector<int> turns;
+    Evas_Object* shape = evas_object_rectangle_add(stage().canvas());
+    evas_object_resize(shape, Stage::SIZE, Stage::SIZE);
+    evas_object_show(shape);
+    evas_object_event_callback_add(
+        shape, EVAS_CALLBACK_MOUSE_WHEEL,
+        [](void* all, Evas*, Evas_Object*, void* info) {
+            static_cast<std::vector<int>*>(all)->push_back(
+                static_cast<Evas_Event_Mouse_Wheel*>(info)->z);
+        },
+        &turns);
+    EXPECT_EQ(ask({"bezel", "7", "180", "180"}).problem, "");
+    EXPECT_EQ(ask({"bezel", "-7", "180", "180"}).problem, "");
+    EXPECT_EQ(ask({"bezel", "1x", "180", "180"}).problem,
+              "the bezel needs a direction and a place");
+    Stage::frames(2);
+    EXPECT_THAT(turns, testing::ElementsAre(1, -1));
+    evas_object_del(shape);
+}
+
+TEST_F(RemoteFaceTest, aPlaceOrAKeyThatIsNoneIsRefused) {
+    const std::string place = "the pointer needs move, down or up, a button and a place";
+    EXPECT_EQ(ask({"pointer", "down", "", "2", "3"}).problem, place);
+    EXPECT_EQ(ask({"pointer", "down", "1", "x", "3"}).problem, place);
+    EXPECT_EQ(ask({"pointer", "down", "1", "2", "3.5"}).problem, place);
+    const std::string key = "a key needs a name, and down or up";
+    EXPECT_EQ(ask({"key", std::string("F\0", 2), "", "down"}).problem, key);
+    EXPECT_EQ(ask({"key", "F1", "", "sideways"}).problem, key);
+}
+
+TEST_F(RemoteFaceTest, theKeysGoToTheLastApplication) {
+    const auto become = [this](const std::string& name) {
+        const int channel = base::listenAt(folder(), name);
+        Stage::advance(0.1);
+        close(channel);
+    };
+    EXPECT_TRUE(hasKeys());
+    become("0-1");
+    EXPECT_TRUE(hasKeys()) << "that one came before";
+    become("9-1");
+    EXPECT_FALSE(hasKeys());
+    std::filesystem::remove(folder() + "/9-1");
+    Stage::advance(0.1);
+    EXPECT_TRUE(hasKeys());
+    std::ofstream(folder() + "/9-2") << "no application";
+    Stage::advance(0.1);
+    EXPECT_TRUE(hasKeys());
+}
+
+TEST_F(RemoteFaceTest, aWindowThatGoesEndsTheWaitForIt) {
+    openEditor();
+    const ToolkitErrors errors;
+    simulator::RunningWatch watch(folder());
+    Reply reply;
+    std::atomic<bool> over = false;
+    std::thread thread([&] {
+        reply = watch.askFront({"still", "1"});
+        over = true;
+    });
+    for (int frames = 0; !over; ++frames) {
+        Stage::frames(1);
+        usleep(2000);
+        if (frames == 20)
+            takeStageDown();
+    }
+    thread.join();
+    EXPECT_EQ(reply.problem, "no window is shown");
+    EXPECT_EQ(ask({"settings"}).problem, "");
+    EXPECT_EQ(errors.count(), 0) << "a canvas that has gone was used";
+}
+
+TEST_F(RemoteFaceTest, aWaitThatIsOverLeavesTheWindowAlone) {
+    openEditor();
+    const ToolkitErrors errors;
+    EXPECT_NE(ask({"still", "0.2"}).problem, "") << "this loop never sleeps";
+    takeStageDown();
+    EXPECT_EQ(ask({"settings"}).problem, "");
+    EXPECT_EQ(errors.count(), 0) << "a canvas that has gone was used";
 }
