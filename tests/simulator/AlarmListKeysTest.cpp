@@ -172,10 +172,14 @@ TEST_F(AlarmListKeysTest, aBezelThatIsLetGoWhenItsPageHasGoneMeansNoOtherRow) {
     openPage();
     stage().bezel(1);
     openAlarm();
+    const double usual = elm_config_longpress_timeout_get();
+    elm_config_longpress_timeout_set(60);
     bezelDown();
     stage().backKey();
-    Stage::frames(2);
+    stage().settle();
+    ASSERT_EQ(pages(), 1U);
     bezelUp();
+    elm_config_longpress_timeout_set(usual);
     EXPECT_EQ(pages(), 1U) << "the row of the list was pressed";
     takeErrors();
 }

@@ -1,4 +1,5 @@
 // The face as scripts use it: real requests over a real socket, and real screens.
+#define EFL_BETA_API_SUPPORT
 
 #include <algorithm>
 #include <atomic>
@@ -14,10 +15,12 @@
 #include <Elementary.h>
 #include <gmock/gmock.h>
 #include <stdlib.h>
+#include <sys/socket.h>
 #include <unistd.h>
 
 #include "AlarmEditViewController.h"
 #include "base/LocalSocket.h"
+#include "base/Message.h"
 #include "clock/ClockEventListener.h"
 #include "device_remote.h"
 #include "device_settings.h"
@@ -428,4 +431,21 @@ TEST_F(RemoteFaceTest, aWaitThatIsOverLeavesTheWindowAlone) {
     takeStageDown();
     EXPECT_EQ(ask({"settings"}).problem, "");
     EXPECT_EQ(errors.count(), 0) << "a canvas that has gone was used";
+}
+
+TEST_F(RemoteFaceTest, whoHangsUpWhileWaitingLeavesNothingBehind) {
+    const auto listeners = [this] {
+        return efl_event_callback_count(stage().canvas(), EFL_CANVAS_SCENE_EVENT_RENDER_POST);
+    };
+    const unsigned before = listeners();
+    const auto own = *std::filesystem::directory_iterator(folder());
+    const int channel = base::connectTo(folder(), own.path().filename());
+    const std::string request = *base::encodeMessage({"still", "60"});
+    EXPECT_EQ(send(channel, request.data(), request.size(), 0),
+              static_cast<ssize_t>(request.size()));
+    Stage::advance(0.2);
+    EXPECT_EQ(listeners(), before + 1);
+    close(channel);
+    Stage::advance(0.2);
+    EXPECT_EQ(listeners(), before);
 }
