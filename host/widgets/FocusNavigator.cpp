@@ -222,7 +222,6 @@ bool FocusNavigator::startPress() {
     const auto thing = found(FocusView(_root));
     if (!thing || thing->kind != FocusKind::Row)
         return false;
-    _pressedRoot = _root;
     _pressed = *thing;
     _press = ecore_timer_add(elm_config_longpress_timeout_get(), _heldCb, this);
     return true;
@@ -245,9 +244,7 @@ Eina_Bool FocusNavigator::_heldCb(void* data) {
 
 /** While the bezel is pressed its page may go, and the focus may move on. */
 bool FocusNavigator::isStillPressed() {
-    if (!enterPage() || _root != _pressedRoot)
-        return false;
-    const auto thing = found(FocusView(_root));
+    const auto thing = enterPage() ? found(FocusView(_root)) : std::nullopt;
     return thing && isSame(*thing, _pressed);
 }
 

@@ -90,8 +90,7 @@ private:
     std::map<Evas_Object*, Memory> _memories;
     Ecore_Idle_Enterer* _idle = nullptr; ///< While keys lead.
     Ecore_Timer* _press = nullptr;       ///< While the bezel is pressed on a row.
-    Evas_Object* _pressedRoot = nullptr; ///< Where it was pressed last.
-    FocusThing _pressed;                 ///< The row that it was pressed on.
+    FocusThing _pressed;                 ///< The row that it was pressed on last.
     bool _turning = false;
     bool _returns = false;    ///< The page has come, but does not yet show what has the focus.
     bool _endsTyping = false; ///< Return has just gone to a field.
