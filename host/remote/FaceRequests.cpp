@@ -122,8 +122,7 @@ void appendWheels(Evas_Object* object, void* data) {
     auto& answer = *static_cast<Words*>(data);
     appendWheel(answer, "hour", picker->hourWheel());
     appendWheel(answer, "minute", picker->minuteWheel());
-    if (!picker->is24Hours())
-        appendWheel(answer, "half", picker->halfWheel());
+    appendWheel(answer, "half", picker->halfWheel());
 }
 
 /** wheels: for each its name, area, pixels per step, value, "wraps" or nothing, and its texts. */
