@@ -200,6 +200,36 @@ TEST_F(AlarmListKeysTest, aBezelThatIsTurnedWhileItIsPressedMeansNoOtherRow) {
     EXPECT_TRUE(asks()) << "it can be held where it is now";
 }
 
+TEST_F(AlarmListKeysTest, aBezelThatIsPressedAnewIsHeldFromThen) {
+    add(10, 30, true, WEDNESDAY);
+    openPage();
+    stage().bezel(1);
+    const double timeout = elm_config_longpress_timeout_get();
+    bezelDown();
+    Stage::advance(0.7 * timeout);
+    bezelDown();
+    Stage::advance(0.7 * timeout);
+    EXPECT_FALSE(asks()) << "the first press counts still";
+    Stage::advance(0.7 * timeout);
+    EXPECT_TRUE(asks());
+    bezelUp();
+}
+
+TEST_F(AlarmListKeysTest, aBezelThatIsPressedWhileAPageComesMeansNothing) {
+    add(10, 30, true, WEDNESDAY);
+    openPage();
+    stage().bezel(1);
+    openAlarm();
+    stage().backKey();
+    Stage::frames(2);
+    bezelDown();
+    Stage::advance(0.8);
+    EXPECT_FALSE(asks());
+    bezelUp();
+    EXPECT_EQ(pages(), 1U);
+    takeErrors();
+}
+
 TEST_F(AlarmListKeysTest, aBezelThatIsHeldWhileTheWindowGoesMeansNothing) {
     add(10, 30, true, WEDNESDAY);
     openPage();

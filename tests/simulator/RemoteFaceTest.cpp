@@ -133,6 +133,14 @@ protected:
         EXPECT_EQ(problem, "");
         return all;
     }
+    /** The text as it is told, if it is. */
+    std::optional<VisibleText> told(const std::string& text) {
+        std::vector<VisibleText> all;
+        during([&] { simulator::ScriptRun(*_watch).readTexts(all); });
+        const auto found = std::find_if(all.begin(), all.end(),
+                                        [&](const VisibleText& t) { return t.text == text; });
+        return found == all.end() ? std::nullopt : std::optional(*found);
+    }
     void openEditor() {
         ClockAlarmDbData alarm{};
         alarm.hour = 6;
@@ -448,4 +456,129 @@ TEST_F(RemoteFaceTest, whoHangsUpWhileWaitingLeavesNothingBehind) {
     close(channel);
     Stage::advance(0.2);
     EXPECT_EQ(listeners(), before);
+    EXPECT_NE(ask({"still", "0.2"}).problem, "");
+    EXPECT_EQ(listeners(), before) << "the wait is over";
+}
+
+TEST_F(RemoteFaceTest, aKeyHasItsNameAndOnlyTheTextThatItWrites) {
+    struct Key {
+        std::string keyname;
+        std::string key;
+        std::string text;
+    };
+    std::vector<Key> keys;
+    Ecore_Event_Handler* handler = ecore_event_handler_prepend(
+        ECORE_EVENT_KEY_DOWN,
+        [](void* all, int, void* info) -> Eina_Bool {
+            const auto& event = *static_cast<Ecore_Event_Key*>(info);
+            static_cast<std::vector<Key>*>(all)->push_back(
+                {event.keyname, event.key, event.string == nullptr ? "none" : event.string});
+            return ECORE_CALLBACK_PASS_ON;
+        },
+        &keys);
+    EXPECT_EQ(ask({"key", "XF86Reload", "", "down"}).problem, "");
+    EXPECT_EQ(ask({"key", "é", "é", "down"}).problem, "");
+    Stage::frames(2);
+    ecore_event_handler_del(handler);
+    ASSERT_EQ(keys.size(), 2U);
+    EXPECT_EQ(keys[0].keyname, "XF86Reload");
+    EXPECT_EQ(keys[0].key, "XF86Reload");
+    EXPECT_EQ(keys[0].text, "none");
+    EXPECT_EQ(keys[1].key, "é");
+    EXPECT_EQ(keys[1].text, "é");
+}
+
+TEST_F(RemoteFaceTest, whatCannotBeSeenIsNotTold) {
+    Evas* canvas = stage().canvas();
+    Evas_Object* text = evas_object_text_add(canvas);
+    evas_object_text_font_set(text, "Roboto", 30);
+    evas_object_text_text_set(text, "Look");
+    evas_object_move(text, 120, 150);
+    evas_object_show(text);
+    Stage::frames(2);
+    EXPECT_TRUE(told("Look"));
+
+    evas_object_color_set(text, 0, 0, 0, 0);
+    EXPECT_FALSE(told("Look")) << "it has no colour";
+    evas_object_color_set(text, 255, 255, 255, 255);
+
+    Evas_Map* map = evas_map_new(4);
+    evas_map_util_points_populate_from_object(map, text);
+    evas_map_util_points_color_set(map, 0, 0, 0, 0);
+    evas_object_map_set(text, map);
+    evas_object_map_enable_set(text, EINA_TRUE);
+    EXPECT_FALSE(told("Look")) << "it has faded";
+    evas_object_map_enable_set(text, EINA_FALSE);
+    evas_map_free(map);
+    EXPECT_TRUE(told("Look"));
+
+    // A group that leaves its members alone when it is hidden.
+    static const Evas_Smart_Class plain = EVAS_SMART_CLASS_INIT_NAME_VERSION("Plain");
+    static Evas_Smart* const kind = evas_smart_class_new(&plain);
+    Evas_Object* group = evas_object_smart_add(canvas, kind);
+    evas_object_smart_member_add(text, group);
+    evas_object_show(group);
+    EXPECT_TRUE(told("Look"));
+    evas_object_hide(group);
+    EXPECT_FALSE(told("Look")) << "its group is hidden";
+    evas_object_del(group);
+    evas_object_del(text);
+}
+
+TEST_F(RemoteFaceTest, whatLiesBelowAButtonIsCovered) {
+    Evas_Object* table = elm_table_add(stage().window());
+    evas_object_resize(table, Stage::SIZE, Stage::SIZE);
+    const auto addButton = [table](const char* text) {
+        Evas_Object* button = elm_button_add(table);
+        elm_object_text_set(button, text);
+        elm_table_pack(table, button, 0, 0, 1, 1);
+        evas_object_show(button);
+        return button;
+    };
+    addButton("Below");
+    Evas_Object* above = addButton("Above");
+    evas_object_show(table);
+    Stage::frames(3);
+    ASSERT_TRUE(told("Below") && told("Above"));
+    EXPECT_TRUE(told("Below")->covered);
+    EXPECT_FALSE(told("Above")->covered);
+    evas_object_hide(above);
+    Stage::frames(2);
+    EXPECT_FALSE(told("Below")->covered);
+    evas_object_del(table);
+}
+
+TEST_F(RemoteFaceTest, ofTwoThingsOnTheFaceTheUpperOneCovers) {
+    const auto addButton = [this](const char* text, short layer) {
+        Evas_Object* button = elm_button_add(stage().window());
+        elm_object_text_set(button, text);
+        evas_object_resize(button, Stage::SIZE, Stage::SIZE);
+        evas_object_layer_set(button, layer);
+        evas_object_show(button);
+        return button;
+    };
+    Evas_Object* upper = addButton("Upper", 2);
+    Evas_Object* lower = addButton("Lower", 1);
+    Stage::frames(3);
+    EXPECT_FALSE(told("Upper")->covered);
+    EXPECT_TRUE(told("Lower")->covered);
+    evas_object_layer_set(upper, 1);
+    evas_object_stack_below(upper, lower);
+    Stage::frames(2);
+    EXPECT_TRUE(told("Upper")->covered);
+    EXPECT_FALSE(told("Lower")->covered);
+    evas_object_del(upper);
+    evas_object_del(lower);
+}
+
+TEST_F(RemoteFaceTest, aWindowOfAnotherSizeIsNoFace) {
+    Evas_Object* panel = elm_win_add(nullptr, "panel", ELM_WIN_BASIC);
+    evas_object_resize(panel, 400, 600);
+    evas_object_show(panel);
+    ecore_evas_focus_set(ecore_evas_ecore_evas_get(evas_object_evas_get(panel)), EINA_TRUE);
+    const auto size = ask({"picture"}).values;
+    ASSERT_EQ(size.size(), 3U);
+    EXPECT_EQ(size[0], "360");
+    EXPECT_EQ(size[1], "360");
+    evas_object_del(panel);
 }
