@@ -168,9 +168,11 @@ Eina_Bool ListPage::_minuteCb(void* data) {
     }
     // The main loop deletes the timer of a callback that cancels.
     static_cast<void>(self->_minuteTimer.release());
-    self->onMinute();
     // Below another page it waits until it comes back.
-    self->waitForNextMinute();
+    if (self->isOnTop()) {
+        self->onMinute();
+        self->waitForNextMinute();
+    }
     return ECORE_CALLBACK_CANCEL;
 }
 
