@@ -9,6 +9,7 @@
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
+#include <sys/time.h>
 
 #include "device/alarm_server.h"
 #include "device/vconf.h"
@@ -53,8 +54,8 @@ private:
 };
 
 const std::vector<std::string> WALL_CLOCKS{
-    "time", "gettimeofday", "realtime", "timespec_get", "system_clock",
-    "icu",  "glib",         "toolkit",  "sqlite",       "realtime-coarse"};
+    "time", "gettimeofday", "realtime", "timespec_get",    "system_clock", "icu",
+    "glib", "toolkit",      "sqlite",   "realtime-coarse", "tai"};
 const std::vector<std::string> OTHER_CLOCKS{"real",         "monotonic",      "boottime",
                                             "steady_clock", "glib-monotonic", "toolkit-loop"};
 
@@ -127,7 +128,32 @@ TEST_F(DeviceClockTest, AnUnknownZoneLeavesTheLastOne) {
     EXPECT_STREQ(std::getenv("TZ"), "Europe/Berlin");
 }
 
+TEST_F(DeviceClockTest, WithoutAZoneTheDeviceIsWhereTheComputerIs) {
+    const std::string log = standardErrorOf([] { device_host_init(nullptr, nullptr, 0); });
+    EXPECT_THAT(log, testing::Not(testing::HasSubstr("time zone")));
+    EXPECT_STREQ(std::getenv("TZ"), "Europe/Berlin");
+}
+
+TEST_F(DeviceClockTest, OlderFunctionsFillAllThatTheyAreGiven) {
+    std::time_t stored = 0;
+    const std::time_t returned = std::time(&stored);
+    EXPECT_EQ(stored, returned);
+    timeval time{};
+    struct timezone zone {
+        7, 7
+    };
+    EXPECT_EQ(gettimeofday(&time, &zone), 0);
+    EXPECT_EQ(zone.tz_minuteswest, 0);
+    EXPECT_EQ(zone.tz_dsttime, 0);
+    timespec precise{};
+    EXPECT_EQ(timespec_get(&precise, TIME_UTC), TIME_UTC);
+    EXPECT_EQ(timespec_get(&precise, TIME_UTC + 1), 0) << "there is no such base";
+}
+
 TEST_F(DeviceClockTest, ADamagedShiftIsNone) {
+    ASSERT_EQ(vconf_set_int(SHIFT_KEY, DAY), VCONF_OK);
+    device_host_init(nullptr, nullptr, 0);
+    ASSERT_NE(device_host_real_time(), std::time(nullptr));
     ASSERT_EQ(vconf_set_str(SHIFT_KEY, "much"), VCONF_OK);
     device_host_init(nullptr, nullptr, 0);
     EXPECT_EQ(device_host_real_time(), std::time(nullptr));

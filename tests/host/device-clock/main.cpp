@@ -113,6 +113,7 @@ void tellAll() {
     tell("gettimeofday", CLOCK_REALTIME, dayTime());
     tell("realtime", CLOCK_REALTIME, clockTime(CLOCK_REALTIME));
     tell("realtime-coarse", CLOCK_REALTIME, clockTime(CLOCK_REALTIME_COARSE));
+    tell("tai", CLOCK_TAI, clockTime(CLOCK_TAI));
     tell("timespec_get", CLOCK_REALTIME, specTime());
     tell("system_clock", CLOCK_REALTIME, chronoTime<std::chrono::system_clock>());
     tell("icu", CLOCK_REALTIME, ucal_getNow() / 1000);
