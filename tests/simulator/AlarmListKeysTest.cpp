@@ -215,21 +215,6 @@ TEST_F(AlarmListKeysTest, aBezelThatIsPressedAnewIsHeldFromThen) {
     bezelUp();
 }
 
-TEST_F(AlarmListKeysTest, aBezelThatIsPressedWhileAPageComesMeansNothing) {
-    add(10, 30, true, WEDNESDAY);
-    openPage();
-    stage().bezel(1);
-    openAlarm();
-    stage().backKey();
-    Stage::frames(2);
-    bezelDown();
-    Stage::advance(0.8);
-    EXPECT_FALSE(asks());
-    bezelUp();
-    EXPECT_EQ(pages(), 1U);
-    takeErrors();
-}
-
 TEST_F(AlarmListKeysTest, aBezelThatIsHeldWhileTheWindowGoesMeansNothing) {
     add(10, 30, true, WEDNESDAY);
     openPage();

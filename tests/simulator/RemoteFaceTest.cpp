@@ -567,8 +567,17 @@ TEST_F(RemoteFaceTest, ofTwoThingsOnTheFaceTheUpperOneCovers) {
     Stage::frames(2);
     EXPECT_TRUE(told("Upper")->covered);
     EXPECT_FALSE(told("Lower")->covered);
-    evas_object_del(upper);
-    evas_object_del(lower);
+    Evas_Object* text = evas_object_text_add(stage().canvas());
+    evas_object_text_font_set(text, "Roboto", 30);
+    evas_object_text_text_set(text, "Toast");
+    evas_object_pass_events_set(text, EINA_TRUE);
+    evas_object_layer_set(text, 3);
+    evas_object_show(text);
+    evas_object_move(text, 120, 150);
+    Stage::frames(2);
+    EXPECT_FALSE(told("Toast")->covered) << "a touch goes through it to what lies below";
+    for (Evas_Object* object : {upper, lower, text})
+        evas_object_del(object);
 }
 
 TEST_F(RemoteFaceTest, aWindowOfAnotherSizeIsNoFace) {
@@ -576,6 +585,7 @@ TEST_F(RemoteFaceTest, aWindowOfAnotherSizeIsNoFace) {
     evas_object_resize(panel, 400, 600);
     evas_object_show(panel);
     ecore_evas_focus_set(ecore_evas_ecore_evas_get(evas_object_evas_get(panel)), EINA_TRUE);
+    Stage::frames(3);
     const auto size = ask({"picture"}).values;
     ASSERT_EQ(size.size(), 3U);
     EXPECT_EQ(size[0], "360");
