@@ -156,8 +156,7 @@ void ListPage::_dragCb(void* data, Evas_Object*, void*) {
 
 void ListPage::waitForNextMinute() {
     _minuteTimer.reset(
-        isOnTop() ? ecore_timer_add(rules::secondsToNextMinute(std::time(nullptr)), _minuteCb, this)
-                  : nullptr);
+        ecore_timer_add(rules::secondsToNextMinute(std::time(nullptr)), _minuteCb, this));
 }
 
 Eina_Bool ListPage::_minuteCb(void* data) {
