@@ -262,6 +262,9 @@ TEST_F(ControlPanelTest, theClockIsSetByReadingAndByJumps) {
     hand->type("Date and time", "2026-11-18 10:41");
     hand->click("Set the clock");
     EXPECT_NEAR(number("db/setting/clock_shift"), 3600, 5);
+    hand->type("Date and time", "2026-11-18 11:41");
+    hand->key("Return", "\n");
+    EXPECT_NEAR(number("db/setting/clock_shift"), 7200, 5);
     hand->click("Back to the real time");
     EXPECT_EQ(number("db/setting/clock_shift"), 0);
     EXPECT_EQ(message(), "Real time");

@@ -122,3 +122,40 @@ TEST_F(ForegroundTest, theCompanionsFocusIsThatOfTheApplication) {
     focus(false);
     EXPECT_EQ(recorder.events, (Events{PAUSED, RESUMED, PAUSED})) << "alone again";
 }
+
+TEST_F(ForegroundTest, aCompanionThatIsNoneAnyMoreIsNotListenedTo) {
+    const auto addWindow = [](const char* name) {
+        Evas_Object* window = elm_win_add(nullptr, name, ELM_WIN_BASIC);
+        evas_object_resize(window, 100, 100);
+        evas_object_show(window);
+        return window;
+    };
+    const auto loseFocus = [](Evas_Object* window) {
+        evas_object_smart_callback_call(window, "focus,out", nullptr);
+        Stage::advance(1);
+    };
+    Evas_Object* first = addWindow("first");
+    Evas_Object* second = addWindow("second");
+    foreground->setCompanion(first);
+    foreground->setCompanion(second);
+    loseFocus(first);
+    EXPECT_TRUE(recorder.events.empty()) << "it has been replaced";
+    foreground.reset();
+    loseFocus(second);
+    EXPECT_TRUE(recorder.events.empty()) << "nobody is there to hear it";
+    evas_object_del(first);
+    evas_object_del(second);
+}
+
+TEST_F(ForegroundTest, whoIsCalledBackBetweenTwoWindowsStays) {
+    Evas_Object* companion = elm_win_add(nullptr, "companion", ELM_WIN_BASIC);
+    evas_object_show(companion);
+    foreground->setCompanion(companion);
+    focus(true);
+    focus(false);
+    foreground->leave(false);
+    Stage::advance(1);
+    EXPECT_TRUE(recorder.events.empty());
+    foreground->setCompanion(nullptr);
+    evas_object_del(companion);
+}

@@ -1,19 +1,24 @@
 // What the display shows while nobody looks at any application.
 
+#include <cstdlib>
 #include <string>
 #include <vector>
 
+#include <Ecore_Evas.h>
+#include <Ecore_Input.h>
 #include <Elementary.h>
 #include <gmock/gmock.h>
 
 #include "EventRecorder.h"
 #include "Foreground.h"
 #include "Keys.h"
+#include "WatchFace.h"
 #include "control/DeviceActions.h"
 #include "device/eext.h"
 #include "device_remote.h"
 #include "device_settings.h"
 #include "support/ScreenTest.h"
+#include "support/ToolkitErrors.h"
 
 using testing::ElementsAre;
 
@@ -77,15 +82,76 @@ TEST_F(HomeScreenTest, itShowsTheTimeAndTheApplicationGetsNothing) {
 }
 
 TEST_F(HomeScreenTest, theApplicationComesBackAsItWas) {
+    const ToolkitErrors errors;
     simulator::goToBackground();
     Stage::frames(2);
     simulator::comeToForeground();
-    Stage::frames(2);
+    Stage::advance(1);
+    EXPECT_EQ(errors.count(), 0) << "the time goes on";
     EXPECT_FALSE(stage().shows("09:41"));
     use();
     EXPECT_EQ(clicks, 1);
     EXPECT_EQ(turns, 1);
     EXPECT_EQ(backs, 1);
+}
+
+TEST_F(HomeScreenTest, theTimeStandsInTheMiddleBelowToasts) {
+    simulator::goToBackground();
+    Stage::frames(2);
+    const auto time = stage().findText("09:41");
+    ASSERT_TRUE(time);
+    EXPECT_NEAR(time->area.middle().x, Stage::SIZE / 2, 1);
+    EXPECT_NEAR(time->area.middle().y, Stage::SIZE / 2, 1);
+    Evas_Object* toast = evas_object_rectangle_add(stage().canvas());
+    evas_object_color_set(toast, 255, 0, 0, 255);
+    evas_object_resize(toast, Stage::SIZE, Stage::SIZE);
+    evas_object_layer_set(toast, simulator::LAYER_TOAST);
+    evas_object_show(toast);
+    Stage::frames(2);
+    EXPECT_EQ(stage().pixel(180, 100) & 0xFFFFFFU, 0xFF0000U);
+    evas_object_del(toast);
+}
+
+TEST_F(HomeScreenTest, keysAndTurnsOfOtherWindowsAndFunctionKeysPass) {
+    simulator::goToBackground();
+    Stage::frames(2);
+    std::vector<std::string> passed;
+    Ecore_Event_Handler* keys = ecore_event_handler_add(
+        ECORE_EVENT_KEY_DOWN,
+        [](void* all, int, void* info) -> Eina_Bool {
+            static_cast<std::vector<std::string>*>(all)->emplace_back(
+                static_cast<Ecore_Event_Key*>(info)->keyname);
+            return ECORE_CALLBACK_PASS_ON;
+        },
+        &passed);
+    Ecore_Event_Handler* wheel = ecore_event_handler_add(
+        ECORE_EVENT_MOUSE_WHEEL,
+        [](void* all, int, void*) -> Eina_Bool {
+            static_cast<std::vector<std::string>*>(all)->emplace_back("wheel");
+            return ECORE_CALLBACK_PASS_ON;
+        },
+        &passed);
+    const Ecore_Window own = ecore_evas_window_get(ecore_evas_ecore_evas_get(stage().canvas()));
+    const auto press = [](const char* name, Ecore_Window window) {
+        auto* event = static_cast<Ecore_Event_Key*>(calloc(1, sizeof(Ecore_Event_Key)));
+        event->keyname = event->key = name;
+        event->window = event->event_window = window;
+        ecore_event_add(ECORE_EVENT_KEY_DOWN, event, nullptr, nullptr);
+    };
+    press("F", own);
+    press("F9", own);
+    press("Return", own);
+    press("F", own + 77);
+    for (const Ecore_Window window : {own, own + 77}) {
+        auto* event =
+            static_cast<Ecore_Event_Mouse_Wheel*>(calloc(1, sizeof(Ecore_Event_Mouse_Wheel)));
+        event->window = event->event_window = window;
+        ecore_event_add(ECORE_EVENT_MOUSE_WHEEL, event, nullptr, nullptr);
+    }
+    Stage::frames(2);
+    ecore_event_handler_del(keys);
+    ecore_event_handler_del(wheel);
+    EXPECT_THAT(passed, ElementsAre("F9", "F", "wheel"));
 }
 
 TEST_F(HomeScreenTest, theTimeGoesOnInTheDevicesForm) {
@@ -150,8 +216,10 @@ TEST_F(HomeScreenTest, whoCallsTheApplicationBackLooksAtIt) {
 
 TEST_F(HomeScreenTest, itGoesWithItsWindow) {
     simulator::goToBackground();
+    const ToolkitErrors errors;
     takeStageDown();
     Stage::advance(1);
+    EXPECT_EQ(errors.count(), 0);
     EXPECT_TRUE(stage().texts().empty());
     simulator::goToBackground();
     Stage::frames(2);
