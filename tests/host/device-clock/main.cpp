@@ -66,6 +66,12 @@ double sqliteTime() {
     return value;
 }
 
+double storedTime() {
+    std::time_t now = 0;
+    std::time(&now);
+    return static_cast<double>(now);
+}
+
 void tell(const char* name, clockid_t real, double shown) {
     // Rounded down to half a minute: some clocks have whole seconds only.
     constexpr double STEP = 30;
@@ -110,6 +116,7 @@ double waitOfThread() {
 
 void tellAll() {
     tell("time", CLOCK_REALTIME, static_cast<double>(std::time(nullptr)));
+    tell("time-stored", CLOCK_REALTIME, storedTime());
     tell("gettimeofday", CLOCK_REALTIME, dayTime());
     tell("realtime", CLOCK_REALTIME, clockTime(CLOCK_REALTIME));
     tell("realtime-coarse", CLOCK_REALTIME, clockTime(CLOCK_REALTIME_COARSE));
