@@ -142,6 +142,8 @@ private:
 
     // Date line.
     void _updateDateText();
+    void refreshDateText();
+    void refreshUndatedText();
     void armMinuteTimer();
 
     // Sound.

@@ -45,6 +45,11 @@ public:
     /** @brief Brings the strip up to date after the day or the language may have changed. */
     void updateDateText();
 
+    /** @brief The strip's text, also while the list has taken the strip away; may be empty. */
+    std::string getDateText() const;
+    /** @brief Writes the strip's text, or that of the next strip while there is none. */
+    void setDateText(const std::string& text);
+
     /** @brief Lets the list's next update of the row make its content anew. */
     void renewContent();
 

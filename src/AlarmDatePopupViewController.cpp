@@ -35,9 +35,9 @@ std::tm selectedDay(Evas_Object* calendar) {
     return selected;
 }
 
-void setStripText(const AlarmTimePickerItem* timePicker, const std::string& text) {
-    if (Evas_Object* strip = timePicker ? timePicker->getCalendarObj() : nullptr)
-        elm_object_part_text_set(strip, "date.text", text.c_str());
+void setStripText(AlarmTimePickerItem* timePicker, const std::string& text) {
+    if (timePicker)
+        timePicker->setDateText(text);
 }
 
 void updateRow(const AlarmRepeatItem* row) {

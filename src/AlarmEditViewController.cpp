@@ -389,6 +389,7 @@ void AlarmEditViewController::_onTypePopupViewSelectedCb() {
 void AlarmEditViewController::onEvent(ClockEventListener::EventType type) {
     switch (type) {
     case ClockEventListener::TIME_CHANGED:
+        refreshUndatedText();
         refreshTimePicker();
         break;
     case ClockEventListener::LANGUAGE_CHANGED:
@@ -403,8 +404,7 @@ void AlarmEditViewController::onEvent(ClockEventListener::EventType type) {
         stopPreview();
         break;
     case ClockEventListener::RESUMED:
-        if (AlarmTimePickerItem* row = timePickerRow())
-            row->updateDateText();
+        refreshDateText();
         matchToneRowToPowerSaving();
         endVolumeMirroring();
         armMinuteTimer();

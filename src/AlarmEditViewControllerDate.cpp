@@ -18,9 +18,21 @@ void AlarmEditViewController::_updateDateText() {
                                    ring.midnight, MAX_SUMMARY_BYTES);
         _date = ring.day;
     }
+    if (AlarmTimePickerItem* row = timePickerRow())
+        row->setDateText(text);
+}
+
+void AlarmEditViewController::refreshDateText() {
+    if (AlarmTimePickerItem* row = timePickerRow())
+        row->updateDateText();
+    refreshUndatedText();
+}
+
+void AlarmEditViewController::refreshUndatedText() {
+    // The row knows the days of dated alarms only. A new alarm's line is blank until it has a day.
     const AlarmTimePickerItem* row = timePickerRow();
-    if (Evas_Object* calendar = row ? row->getCalendarObj() : nullptr)
-        elm_object_part_text_set(calendar, "date.text", text.c_str());
+    if (row && rules::isUndated(_alarm) && !row->getDateText().empty())
+        _updateDateText();
 }
 
 void AlarmEditViewController::armMinuteTimer() {
@@ -32,8 +44,7 @@ void AlarmEditViewController::armMinuteTimer() {
 bool AlarmEditViewController::_updateDateTextTimerCb(void* data) {
     RETURN_IF_NULL(data, false);
     auto* self = static_cast<AlarmEditViewController*>(data);
-    if (AlarmTimePickerItem* row = self->timePickerRow())
-        row->updateDateText();
+    self->refreshDateText();
     self->armMinuteTimer();
     return false;
 }

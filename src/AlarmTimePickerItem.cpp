@@ -55,7 +55,7 @@ std::string dateButtonLabel() {
     return ClockStringUtil::changeStringToUpper(std::string(label));
 }
 
-void setDateText(Evas_Object* calendar, const std::string& text) {
+void writeDateText(Evas_Object* calendar, const std::string& text) {
     elm_object_part_text_set(calendar, "date.text", text.c_str());
 }
 
@@ -177,13 +177,23 @@ Evas_Object* AlarmTimePickerItem::createDateButton(Evas_Object* calendar) {
 
 void AlarmTimePickerItem::showDate(Evas_Object* calendar) {
     if (_alarm.autoDate != 0)
-        setDateText(calendar, ringDateText());
+        writeDateText(calendar, ringDateText());
     else if (_alarm.repeatWeekly != 0)
-        setDateText(calendar, rules::weekdaySummary(_alarm.repeatWeekly));
-    else if (const Evas_Object* before = _calendars.newest())
-        setDateText(calendar, dateTextOf(before));
-    else if (!_lastDateText.empty())
-        setDateText(calendar, _lastDateText);
+        writeDateText(calendar, rules::weekdaySummary(_alarm.repeatWeekly));
+    else if (const std::string before = getDateText(); !before.empty())
+        writeDateText(calendar, before);
+}
+
+std::string AlarmTimePickerItem::getDateText() const {
+    const Evas_Object* calendar = getCalendarObj();
+    return calendar ? dateTextOf(calendar) : _lastDateText;
+}
+
+void AlarmTimePickerItem::setDateText(const std::string& text) {
+    if (Evas_Object* calendar = getCalendarObj())
+        writeDateText(calendar, text);
+    else
+        _lastDateText = text;
 }
 
 void AlarmTimePickerItem::_calendarDeletedCb(void* data, Evas*, Evas_Object* calendar, void*) {
@@ -237,8 +247,7 @@ void AlarmTimePickerItem::_datetimeChangedCb(void* data, Evas_Object* datetime, 
     alarm.autoDate = static_cast<std::int32_t>(ring.midnight);
     self->_date = ring.day;
     const auto line = ring.today ? rules::DateLine::TodayAndDate : rules::DateLine::TomorrowAndDate;
-    if (Evas_Object* calendar = self->getCalendarObj())
-        setDateText(calendar, rules::dateLineText(line, ring.midnight));
+    self->setDateText(rules::dateLineText(line, ring.midnight));
 }
 
 void AlarmTimePickerItem::_dateBtnClickedCb(void* data, Evas_Object*, void*) {

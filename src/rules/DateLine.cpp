@@ -40,6 +40,10 @@ void setPickedDate(ClockAlarmDbData& alarm, std::time_t midnight) {
     alarm.repeatWeekly = 0;
 }
 
+bool isUndated(const ClockAlarmDbData& alarm) {
+    return alarm.repeatWeekly == 0 && alarm.autoDate == 0;
+}
+
 bool isBeforeDay(const std::tm& day, const std::tm& today) {
     return std::tie(day.tm_year, day.tm_mon, day.tm_mday) <
            std::tie(today.tm_year, today.tm_mon, today.tm_mday);

@@ -27,6 +27,9 @@ void clearPastDate(ClockAlarmDbData& alarm);
 // A one-time alarm on a day that was picked; 0 leaves the day to the time of day.
 void setPickedDate(ClockAlarmDbData& alarm, std::time_t midnight);
 
+// True for an alarm without repeat days and without a date: the time of day alone decides its day.
+bool isUndated(const ClockAlarmDbData& alarm);
+
 // True when a day lies before another one.
 bool isBeforeDay(const std::tm& day, const std::tm& today);
 

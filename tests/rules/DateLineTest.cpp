@@ -68,6 +68,26 @@ TEST(DateLineTest, ADayThatIsOverMakesAOneTimeAlarmWithoutDates) {
     EXPECT_EQ(alarm.manualDate, 0);
 }
 
+struct UndatedCase {
+    int repeatWeekly;
+    std::int32_t autoDate;
+    bool undated;
+};
+
+class UndatedTest : public testing::TestWithParam<UndatedCase> {};
+
+TEST_P(UndatedTest, HasNeitherRepeatDaysNorADate) {
+    ClockAlarmDbData alarm{};
+    alarm.repeatWeekly = GetParam().repeatWeekly;
+    alarm.autoDate = GetParam().autoDate;
+    EXPECT_EQ(rules::isUndated(alarm), GetParam().undated);
+}
+
+INSTANTIATE_TEST_SUITE_P(Records, UndatedTest,
+                         testing::Values(UndatedCase{0, 0, true}, UndatedCase{2, 0, false},
+                                         UndatedCase{0, 1000, false},
+                                         UndatedCase{127, 1000, false}));
+
 TEST(DateLineTest, AWordAndADateAreJoinedByADash) {
     EXPECT_EQ(rules::wordAndDate("Today", "Wed, Nov 18"), "Today - Wed, Nov 18");
     EXPECT_EQ(rules::wordAndDate("Today", ""), "Today - ");

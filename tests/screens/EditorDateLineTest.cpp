@@ -1,5 +1,6 @@
 #include <gtest/gtest.h>
 
+#include "screens/DatePopupFixture.h"
 #include "screens/EditorFixture.h"
 #include "screens/TestCatalogue.h"
 #include "support/LiveObjects.h"
@@ -292,6 +293,153 @@ TEST_F(EditorMinuteTimerTest, ThePickedDateSurvivesTheMinute) {
 TEST_F(EditorMinuteTimerTest, ToleratesAMissingEditor) {
     EXPECT_FALSE(AlarmEditViewController::_updateDateTextTimerCb(nullptr));
     expectLog("Data is NULL !!");
+}
+
+/** An alarm without a day of its own whose line has been written all the same. */
+class EditorUndatedLineTest : public EditorDateLineTest {
+protected:
+    /** A new alarm for six, whose line another language brings. */
+    void openAtFive() {
+        VirtualClock::setNow("Europe/Berlin", "2026-11-18 05:00:00");
+        createAlarm();
+        ASSERT_EQ(dateText(), "");
+        ASSERT_EQ(lineOnLanguageChange(), "Today - Wed, Nov 18");
+    }
+    std::string lineAfter(ClockEventListener::EventType event, const char* now) {
+        VirtualClock::setNow("Europe/Berlin", now);
+        ClockEventListener::raise(event);
+        stage().settle();
+        return dateText();
+    }
+    void tapDateButton() {
+        stage().tapPart(timePickerRow().getCalendarObj(), "date.button");
+        stage().settle();
+    }
+    /** The list takes the content of the row away. */
+    void scrollToName() {
+        stage().showRow(nameRow().getElmObjectItem());
+        while (timePickerRow().getCalendarObj())
+            evas_object_del(timePickerRow().getCalendarObj());
+    }
+    std::string lineAtTheTop() {
+        Elm_Object_Item* const row = timePickerRow().getElmObjectItem();
+        elm_genlist_item_update(row);
+        stage().showRow(row);
+        stage().settle();
+        return dateText();
+    }
+};
+
+TEST_F(EditorUndatedLineTest, ANewAlarmsLineStaysBlankWhateverTheTime) {
+    createAlarm();
+    Stage::advance(61);
+    EXPECT_EQ(dateText(), "");
+    EXPECT_EQ(lineAfter(ClockEventListener::RESUMED, "2026-11-18 12:00:00"), "");
+    EXPECT_EQ(lineAfter(ClockEventListener::TIME_CHANGED, "2026-11-19 05:00:00"), "");
+}
+
+TEST_F(EditorUndatedLineTest, FollowsAClockThatIsSet) {
+    openAtFive();
+    EXPECT_EQ(lineAfter(ClockEventListener::TIME_CHANGED, "2026-11-18 06:00:00"),
+              "Tomorrow - Thu, Nov 19");
+    EXPECT_EQ(lineAfter(ClockEventListener::TIME_CHANGED, "2026-11-24 23:59:50"),
+              "Tomorrow - Wed, Nov 25");
+    EXPECT_EQ(lineAfter(ClockEventListener::TIME_CHANGED, "2026-11-25 00:00:00"),
+              "Today - Wed, Nov 25");
+}
+
+TEST_F(EditorUndatedLineTest, FollowsTheMinute) {
+    openAtFive();
+    VirtualClock::setNow("Europe/Berlin", "2026-11-18 05:59:00");
+    Stage::advance(61);
+    EXPECT_EQ(dateText(), "Tomorrow - Thu, Nov 19");
+}
+
+TEST_F(EditorUndatedLineTest, IsUpToDateWhenTheApplicationComesBack) {
+    openAtFive();
+    ClockEventListener::raise(ClockEventListener::PAUSED);
+    EXPECT_EQ(lineAfter(ClockEventListener::RESUMED, "2026-11-18 06:00:00"),
+              "Tomorrow - Thu, Nov 19");
+}
+
+TEST_F(EditorUndatedLineTest, TheDatePopupOpensOnTheDayInTheLine) {
+    openAtFive();
+    lineAfter(ClockEventListener::TIME_CHANGED, "2026-11-24 23:00:00");
+    tapDateButton();
+    EXPECT_EQ(DatePopupOnFace(stage()).selectedDay(), "2026-11-25");
+}
+
+TEST_F(EditorUndatedLineTest, TodayFromTheDatePopupFollowsTheMinute) {
+    VirtualClock::setNow("Europe/Berlin", "2026-11-18 05:59:00");
+    createAlarm();
+    tapDateButton();
+    DatePopupOnFace(stage()).tapSet();
+    stage().settle();
+    ASSERT_EQ(dateText(), "Today - Wed, Nov 18");
+    Stage::advance(61);
+    EXPECT_EQ(dateText(), "Tomorrow - Thu, Nov 19");
+}
+
+TEST_F(EditorUndatedLineTest, ALineWithoutRepeatDaysFollowsAClockThatIsSet) {
+    ClockAlarmDbData alarm = anAlarm(9, 42);
+    alarm.repeatWeekly = 2;
+    editAlarm(alarm);
+    stage().tapRow(elm_genlist_item_next_get(elm_genlist_first_item_get(genlist())));
+    stage().settle();
+    stage().tapText("Every Monday");
+    stage().settle();
+    stage().backKey();
+    stage().settle();
+    ASSERT_EQ(dateText(), "Today - Wed, Nov 18");
+    EXPECT_EQ(lineAfter(ClockEventListener::TIME_CHANGED, "2026-11-18 12:00:00"),
+              "Tomorrow - Thu, Nov 19");
+}
+
+TEST_F(EditorUndatedLineTest, ARepairedLineFollowsAClockThatIsSet) {
+    ClockAlarmDbData alarm = anAlarm(7, 0);
+    alarm.autoDate = alarm.manualDate = static_cast<std::int32_t>(at("2026-11-17 00:00:00"));
+    editAlarm(alarm);
+    expectLog("Set autoDate and manualDate to 0. Time already passed !!");
+    ASSERT_EQ(dateText(), "Tomorrow - Thu, Nov 19");
+    EXPECT_EQ(lineAfter(ClockEventListener::TIME_CHANGED, "2026-11-20 12:00:00"),
+              "Tomorrow - Sat, Nov 21");
+    EXPECT_EQ(lineAfter(ClockEventListener::TIME_CHANGED, "2026-11-21 05:00:00"),
+              "Today - Sat, Nov 21");
+}
+
+TEST_F(EditorUndatedLineTest, RepeatDaysStayWhateverTheTime) {
+    ClockAlarmDbData alarm = anAlarm(7, 0);
+    alarm.repeatWeekly = 62;
+    editAlarm(alarm);
+    EXPECT_EQ(lineAfter(ClockEventListener::RESUMED, "2026-11-20 12:00:00"),
+              "Mon Tue Wed Thu Fri ");
+    EXPECT_EQ(lineAfter(ClockEventListener::TIME_CHANGED, "2026-11-25 12:00:00"),
+              "Mon Tue Wed Thu Fri ");
+}
+
+TEST_F(EditorUndatedLineTest, FollowsWhileItIsOutOfView) {
+    openAtFive();
+    scrollToName();
+    VirtualClock::setNow("Europe/Berlin", "2026-11-18 06:00:00");
+    ClockEventListener::raise(ClockEventListener::RESUMED);
+    EXPECT_EQ(lineAtTheTop(), "Tomorrow - Thu, Nov 19");
+}
+
+TEST_F(EditorUndatedLineTest, SpeaksTheLanguageThatWasChosenWhileItWasOutOfView) {
+    openAtFive();
+    scrollToName();
+    const TestCatalogue german{{"IDS_CLOCK_BODY_TODAY", "Heute"}};
+    ClockEventListener::raise(ClockEventListener::LANGUAGE_CHANGED);
+    EXPECT_EQ(lineAtTheTop(), "Heute - Wed, Nov 18");
+}
+
+TEST_F(EditorUndatedLineTest, WhatItTellsIsWhatIsSaved) {
+    openAtFive();
+    ASSERT_EQ(lineAfter(ClockEventListener::TIME_CHANGED, "2026-11-18 06:00:00"),
+              "Tomorrow - Thu, Nov 19");
+    tapDone();
+    ASSERT_EQ(storedAlarms().size(), 1U);
+    EXPECT_EQ(civil(storedAlarms().front().autoDate), "2026-11-19 00:00:00");
 }
 
 } // namespace

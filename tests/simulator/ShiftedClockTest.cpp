@@ -130,6 +130,50 @@ TEST_F(ShiftedClockTest, aChosenDayThatIsOverBecomesTomorrow) {
     EXPECT_EQ(dateLine(), "Tomorrow - Thu, Nov 26");
 }
 
+TEST_F(ShiftedClockTest, aLineThatAnotherLanguageHasBroughtIsCountedAnew) {
+    VirtualClock::setNow("Europe/Berlin", "2026-11-18 05:00:00");
+    stage().push(
+        new AlarmEditViewController(ALARM_EDIT_VIEW_CALLER_CLOCK, ClockAlarmDbData(), true));
+    ASSERT_EQ(dateLine(), "none") << "no wheel has turned";
+    device().setSetting(DEVICE_SETTING_LANGUAGE, std::string("de"));
+    stage().settle();
+    ASSERT_EQ(dateLine(), "Today - Wed, Nov 18");
+    setClock("2026-11-18 06:00:00");
+    EXPECT_EQ(dateLine(), "Tomorrow - Thu, Nov 19");
+    setClock("2026-11-18 23:59:50");
+    EXPECT_EQ(dateLine(), "Tomorrow - Thu, Nov 19");
+    const std::time_t end = VirtualClock::now() + 11;
+    while (VirtualClock::now() < end)
+        Stage::frames(1);
+    EXPECT_EQ(dateLine(), "Today - Thu, Nov 19");
+    setZone("Asia/Tokyo");
+    EXPECT_EQ(dateLine(), "Tomorrow - Fri, Nov 20") << "it is eight there";
+}
+
+TEST_F(ShiftedClockTest, aNewAlarmsLineStaysBlank) {
+    stage().push(
+        new AlarmEditViewController(ALARM_EDIT_VIEW_CALLER_CLOCK, ClockAlarmDbData(), true));
+    setClock("2026-11-25 05:00:00");
+    setZone("Asia/Tokyo");
+    EXPECT_EQ(dateLine(), "none");
+}
+
+TEST_F(ShiftedClockTest, aDayThatIsOverInTheBackgroundIsCountedAnewOnTheWayBack) {
+    simulator::Foreground foreground(stage().window());
+    simulator::setForeground(&foreground);
+    openEditor(6, 0);
+    foreground.leave(true);
+    setZone("Pacific/Honolulu");
+    setClock("2026-11-18 23:00:00");
+    expectLog(PAST);
+    ASSERT_EQ(dateLine(), "Tomorrow - Thu, Nov 19");
+    VirtualClock::setNow("Pacific/Honolulu", "2026-11-19 05:00:00");
+    foreground.leave(false);
+    stage().settle();
+    EXPECT_EQ(dateLine(), "Today - Thu, Nov 19");
+    simulator::setForeground(nullptr);
+}
+
 TEST_F(ShiftedClockTest, theEditorFollowsTheZone) {
     openEditor(10, 0);
     setClock("2026-11-19 09:41:00");
