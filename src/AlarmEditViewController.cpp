@@ -25,6 +25,7 @@
 #include "NullData.h"
 #include "ThemePath.h"
 #include "rules/AlarmChange.h"
+#include "rules/DateLine.h"
 #include "rules/EditorRows.h"
 #include "rules/RingDay.h"
 
@@ -338,6 +339,8 @@ void AlarmEditViewController::refreshRow(EditorRow place) {
 }
 
 void AlarmEditViewController::refreshTimePicker() {
+    // The row would show a date of the time before the repeat days, and drop them once it is over.
+    rules::dropDatesOfWeekly(_alarm);
     if (AlarmTimePickerItem* row = timePickerRow())
         row->renewContent();
     refreshRow(EditorRow::TimePicker);

@@ -44,6 +44,13 @@ bool isUndated(const ClockAlarmDbData& alarm) {
     return alarm.repeatWeekly == 0 && alarm.autoDate == 0;
 }
 
+void dropDatesOfWeekly(ClockAlarmDbData& alarm) {
+    if (alarm.repeatWeekly == 0)
+        return;
+    alarm.autoDate = 0;
+    alarm.manualDate = 0;
+}
+
 bool isBeforeDay(const std::tm& day, const std::tm& today) {
     return std::tie(day.tm_year, day.tm_mon, day.tm_mday) <
            std::tie(today.tm_year, today.tm_mon, today.tm_mday);

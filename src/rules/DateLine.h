@@ -30,6 +30,9 @@ void setPickedDate(ClockAlarmDbData& alarm, std::time_t midnight);
 // True for an alarm without repeat days and without a date: the time of day alone decides its day.
 bool isUndated(const ClockAlarmDbData& alarm);
 
+// Takes the dates of an alarm with repeat days away.
+void dropDatesOfWeekly(ClockAlarmDbData& alarm);
+
 // True when a day lies before another one.
 bool isBeforeDay(const std::tm& day, const std::tm& today);
 

@@ -3,6 +3,7 @@
 #include <cstdlib>
 #include <optional>
 
+#include "rules/DateLine.h"
 #include "rules/RingDay.h"
 
 namespace rules {
@@ -44,10 +45,9 @@ std::tm timeOfDay(std::tm day, int hour, int minute, int daylightSaving) {
 } // namespace
 
 RingDate settleRingDate(ClockAlarmDbData& alarm, std::time_t now) {
+    dropDatesOfWeekly(alarm);
     if (alarm.repeatWeekly != 0) {
         alarm.repeatOnce = 0;
-        alarm.autoDate = 0;
-        alarm.manualDate = 0;
         return RingDate::NotChosen;
     }
     alarm.repeatOnce = 1;

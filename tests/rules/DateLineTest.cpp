@@ -88,6 +88,21 @@ INSTANTIATE_TEST_SUITE_P(Records, UndatedTest,
                                          UndatedCase{0, 1000, false},
                                          UndatedCase{127, 1000, false}));
 
+TEST(DateLineTest, RepeatDaysTakeDatesAway) {
+    ClockAlarmDbData alarm{};
+    alarm.autoDate = alarm.manualDate = 1000;
+    alarm.repeatOnce = 1;
+    rules::dropDatesOfWeekly(alarm);
+    EXPECT_EQ(alarm.autoDate, 1000);
+    EXPECT_EQ(alarm.manualDate, 1000);
+    alarm.repeatWeekly = 2;
+    rules::dropDatesOfWeekly(alarm);
+    EXPECT_EQ(alarm.autoDate, 0);
+    EXPECT_EQ(alarm.manualDate, 0);
+    EXPECT_EQ(alarm.repeatWeekly, 2);
+    EXPECT_EQ(alarm.repeatOnce, 1);
+}
+
 TEST(DateLineTest, AWordAndADateAreJoinedByADash) {
     EXPECT_EQ(rules::wordAndDate("Today", "Wed, Nov 18"), "Today - Wed, Nov 18");
     EXPECT_EQ(rules::wordAndDate("Today", ""), "Today - ");

@@ -17,6 +17,16 @@ protected:
         return alarm;
     }
 
+    /** On the repeat screen, and comes back. */
+    void flipMonday() {
+        stage().tapRow(elm_genlist_item_next_get(elm_genlist_first_item_get(genlist())));
+        stage().settle();
+        stage().tapText("Every Monday");
+        stage().settle();
+        stage().backKey();
+        stage().settle();
+    }
+
     std::string lineOnLanguageChange() {
         ClockEventListener::raise(ClockEventListener::LANGUAGE_CHANGED);
         stage().settle();
@@ -102,12 +112,7 @@ TEST_F(EditorDateLineTest, ThePickedDateReturnsWhenTheRowIsMadeAnew) {
 
 TEST_F(EditorDateLineTest, TheRepeatScreenBringsTheDays) {
     editAlarm(anAlarm(7, 0));
-    stage().tapRow(elm_genlist_item_next_get(elm_genlist_first_item_get(genlist())));
-    stage().settle();
-    stage().tapText("Every Monday");
-    stage().settle();
-    stage().backKey();
-    stage().settle();
+    flipMonday();
     EXPECT_EQ(dateText(), "Mon ");
 }
 
@@ -115,12 +120,7 @@ TEST_F(EditorDateLineTest, TheRepeatScreenWithoutDaysBringsTheNextRing) {
     ClockAlarmDbData alarm = anAlarm(7, 0);
     alarm.repeatWeekly = 2;
     editAlarm(alarm);
-    stage().tapRow(elm_genlist_item_next_get(elm_genlist_first_item_get(genlist())));
-    stage().settle();
-    stage().tapText("Every Monday");
-    stage().settle();
-    stage().backKey();
-    stage().settle();
+    flipMonday();
     EXPECT_EQ(dateText(), "Tomorrow - Thu, Nov 19");
 }
 
@@ -384,12 +384,7 @@ TEST_F(EditorUndatedLineTest, ALineWithoutRepeatDaysFollowsAClockThatIsSet) {
     ClockAlarmDbData alarm = anAlarm(9, 42);
     alarm.repeatWeekly = 2;
     editAlarm(alarm);
-    stage().tapRow(elm_genlist_item_next_get(elm_genlist_first_item_get(genlist())));
-    stage().settle();
-    stage().tapText("Every Monday");
-    stage().settle();
-    stage().backKey();
-    stage().settle();
+    flipMonday();
     ASSERT_EQ(dateText(), "Today - Wed, Nov 18");
     EXPECT_EQ(lineAfter(ClockEventListener::TIME_CHANGED, "2026-11-18 12:00:00"),
               "Tomorrow - Thu, Nov 19");
@@ -415,6 +410,29 @@ TEST_F(EditorUndatedLineTest, RepeatDaysStayWhateverTheTime) {
               "Mon Tue Wed Thu Fri ");
     EXPECT_EQ(lineAfter(ClockEventListener::TIME_CHANGED, "2026-11-25 12:00:00"),
               "Mon Tue Wed Thu Fri ");
+}
+
+TEST_F(EditorUndatedLineTest, RepeatDaysOutliveTheDayThatTheWheelsHadBrought) {
+    createAlarm();
+    pick(10, 0);
+    flipMonday();
+    ASSERT_EQ(dateText(), "Mon ");
+    EXPECT_EQ(lineOnLanguageChange(), "Mon ");
+    EXPECT_EQ(lineAfter(ClockEventListener::TIME_CHANGED, "2026-11-25 12:00:00"), "Mon ");
+    flipMonday();
+    EXPECT_EQ(dateText(), "Tomorrow - Thu, Nov 26");
+    flipMonday();
+    tapDone();
+    ASSERT_EQ(storedAlarms().size(), 1U);
+    EXPECT_EQ(storedAlarms().front().repeatWeekly, 2);
+}
+
+TEST_F(EditorUndatedLineTest, RepeatDaysOutliveAPickedDayThatIsOver) {
+    ClockAlarmDbData alarm = anAlarm(7, 0);
+    alarm.autoDate = alarm.manualDate = static_cast<std::int32_t>(at("2026-11-19 00:00:00"));
+    editAlarm(alarm);
+    flipMonday();
+    EXPECT_EQ(lineAfter(ClockEventListener::TIME_CHANGED, "2026-11-25 12:00:00"), "Mon ");
 }
 
 TEST_F(EditorUndatedLineTest, FollowsWhileItIsOutOfView) {
