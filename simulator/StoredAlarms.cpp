@@ -9,9 +9,8 @@
 #include "AlarmOnOff.h"
 #include "clock/ClockAlarmDbModel.h"
 #include "clock/ClockAlarmManagerModel.h"
+#include "clock/ClockAlarmToast.h"
 #include "clock/ClockNotificationModel.h"
-#include "clock/ClockStringUtil.h"
-#include "device/notification.h"
 #include "device/vconf.h"
 
 #define LOG_TAG "clock-sim"
@@ -51,16 +50,6 @@ void clearTraces(int id) {
     vconf_set_int(ENABLED_ALARMS_KEY, ClockAlarmDbModel().getNumberOfEnabledAlarmList());
 }
 
-void tellWhenItRings(const ClockAlarmDbData& alarm) {
-    int days = 0;
-    int hours = 0;
-    int minutes = 0;
-    ClockStringUtil::getAlertTimeOffset(alarm, &days, &hours, &minutes);
-    std::string text;
-    ClockStringUtil::generateAlertOffsetToastPopupText(days, hours, minutes, text);
-    notification_status_message_post(text.c_str());
-}
-
 } // namespace
 
 bool switchStoredAlarm(int id, bool on) {
@@ -76,7 +65,7 @@ bool switchStoredAlarm(int id, bool on) {
     }
     clearTraces(id);
     if (on)
-        tellWhenItRings(alarm);
+        postTimeToRing(alarm);
     return true;
 }
 

@@ -9,9 +9,9 @@
 #include <base/Text.h>
 #include <clock/ClockAlarmDbModel.h>
 #include <clock/ClockAlarmManagerModel.h>
+#include <clock/ClockAlarmToast.h>
 #include <clock/ClockIcuDataModel.h>
 #include <clock/ClockNotificationModel.h>
-#include <clock/ClockStringUtil.h>
 #include <clock/ClockText.h>
 #include <clock/LoggingModel.h>
 #include <device/notification.h>
@@ -172,14 +172,7 @@ int AlarmEditViewController::alarmMgrIdOf(int alarmId) {
 
 void AlarmEditViewController::_createNotiToastForTimeOffest(void* data) {
     RETURN_IF_NULL(data);
-    const ClockAlarmDbData alarm = static_cast<AlarmEditViewController*>(data)->_alarm;
-    int days = 0;
-    int hours = 0;
-    int minutes = 0;
-    ClockStringUtil::getAlertTimeOffset(alarm, &days, &hours, &minutes);
-    std::string text;
-    ClockStringUtil::generateAlertOffsetToastPopupText(days, hours, minutes, text);
-    notification_status_message_post(text.c_str());
+    postTimeToRing(static_cast<AlarmEditViewController*>(data)->_alarm);
 }
 
 void AlarmEditViewController::_createNotiToastForDuplicatedAlarm(void* data) {
