@@ -175,7 +175,7 @@ public:
           _panel(window, theme, [window](bool shown) { sendQuickPanelMessage(window, shown); }),
           _keys([this] { _panel.toggle(); }), _volumeKeys([this](int level) { showVolume(level); }),
           _foreground(window) {
-        addBezel(window);
+        device_app_add_bezel(window);
         setQuickPanel(&_panel);
         setForeground(&_foreground);
         if (controls.value_or(hasRoomForPanel(window)))

@@ -15,10 +15,4 @@ inline constexpr int FACE_SIZE = 360;
 inline constexpr short LAYER_SYSTEM = EVAS_LAYER_MAX - 2;
 inline constexpr short LAYER_TOAST = EVAS_LAYER_MAX - 1;
 
-/**
- * @brief Covers what lies outside the circle with the body of the watch.
- * @param window The window, FACE_SIZE pixels square; owns the cover, which lets input through.
- */
-void addBezel(Evas_Object* window);
-
 } // namespace simulator

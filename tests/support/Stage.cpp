@@ -9,7 +9,7 @@
 #include <gtest/gtest.h>
 
 #include "app_assist/WContentViewController.h"
-#include "simulator/WatchFace.h"
+#include "device_app.h"
 #include "support/VirtualClock.h"
 
 namespace {
@@ -40,7 +40,7 @@ Stage::Stage() {
     _naviframe = new app_assist::WNaviframeController;
     _window->setBaseController(_naviframe);
     evas_event_callback_add(canvas(), EVAS_CALLBACK_RENDER_FLUSH_POST, renderedCb, _rendered.get());
-    simulator::addBezel(window());
+    device_app_add_bezel(window());
     // A window of the buffer engine has the focus for the toolkit only after it was without it.
     Ecore_Evas* const ee = ecore_evas_ecore_evas_get(canvas());
     ecore_evas_focus_set(ee, EINA_FALSE);
