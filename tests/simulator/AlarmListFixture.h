@@ -16,6 +16,7 @@
 #include "clock/ClockAlarmManagerModel.h"
 #include "clock/ClockEventListener.h"
 #include "support/ScreenTest.h"
+#include "support/StoredData.h"
 
 /** @brief It is Wednesday, 18 November 2026, 09:41 in Berlin. */
 class AlarmListFixture : public ScreenTest {
@@ -40,15 +41,9 @@ protected:
     /** Stores an alarm with its schedule; on weekdays, or else the next time it comes. */
     static ClockAlarmDbData add(int hour, int minute, bool on, int weekdays = 0,
                                 const std::string& name = "") {
-        ClockAlarmDbData alarm;
-        alarm.leading = 0;
-        alarm.hour = hour;
-        alarm.min = minute;
+        ClockAlarmDbData alarm = alarmAt(hour, minute, weekdays);
         alarm.name = name;
         alarm.enable = on ? 1 : 0;
-        alarm.repeatWeekly = weekdays;
-        alarm.repeatOnce = weekdays == 0 ? 1 : 0;
-        alarm.timeZone = "Europe/Berlin";
         return add(alarm);
     }
     static ClockAlarmDbData add(ClockAlarmDbData alarm) {

@@ -8,6 +8,7 @@
 
 #include "screens/TestCatalogue.h"
 #include "support/ScreenTest.h"
+#include "support/StoredData.h"
 
 using simulator::alarmDaysText;
 using simulator::alarmTimeText;
@@ -20,19 +21,7 @@ namespace {
 
 class AlarmListTextTest : public ScreenTest {
 protected:
-    static ClockAlarmDbData alarmAt(int hour, int minute) {
-        ClockAlarmDbData alarm;
-        alarm.leading = 0;
-        alarm.enable = 1;
-        alarm.hour = hour;
-        alarm.min = minute;
-        return alarm;
-    }
-    static ClockAlarmDbData alarmOn(int weekdays) {
-        ClockAlarmDbData alarm = alarmAt(6, 0);
-        alarm.repeatWeekly = weekdays;
-        return alarm;
-    }
+    static ClockAlarmDbData alarmOn(int weekdays) { return alarmAt(6, 0, weekdays); }
 };
 
 } // namespace

@@ -9,6 +9,7 @@
 #include <gtest/gtest.h>
 
 #include "base/CivilTime.h"
+#include "support/StoredData.h"
 #include "support/VirtualClock.h"
 
 using simulator::keepOrder;
@@ -27,15 +28,9 @@ constexpr const char* BERLIN = "Europe/Berlin";
 
 /** A day of November 2026; none = the next time the clock shows the time. */
 ClockAlarmDbData alarm(int id, int hour, int minute, bool on, int weekdays = 0, int day = 0) {
-    ClockAlarmDbData alarm;
-    alarm.leading = 0;
+    ClockAlarmDbData alarm = alarmAt(hour, minute, weekdays);
     alarm.id = id;
-    alarm.hour = hour;
-    alarm.min = minute;
     alarm.enable = on ? 1 : 0;
-    alarm.repeatWeekly = weekdays;
-    alarm.repeatOnce = weekdays == 0 ? 1 : 0;
-    alarm.timeZone = BERLIN;
     if (day != 0) {
         alarm.autoDate =
             static_cast<std::int32_t>(base::toInstant({{2026, 11, day}, 0, 0, 0}, BERLIN));

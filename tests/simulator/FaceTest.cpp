@@ -1,7 +1,6 @@
 // Nothing that matters on the simulator's own pages is cut by the circle.
 
 #include <string>
-#include <vector>
 
 #include <Elementary.h>
 #include <gtest/gtest.h>
@@ -11,11 +10,10 @@
 #include "ToastView.h"
 #include "VolumeView.h"
 #include "WorldClockViewController.h"
-#include "clock/ClockAlarmDbModel.h"
 #include "clock/ClockStringUtil.h"
-#include "clock/ClockWorldClockDbModel.h"
 #include "support/FaceFixture.h"
 #include "support/ScreenTest.h"
+#include "support/StoredData.h"
 
 using simulator::AlarmListViewController;
 using simulator::QuickPanel;
@@ -40,18 +38,10 @@ protected:
 
     Evas_Object* list() { return stage().widgets("Elm_Genlist").front(); }
     static void store(int hour, int minute, const std::string& name, int weekdays, bool on = true) {
-        ClockAlarmDbData alarm;
-        alarm.leading = 0;
-        alarm.hour = hour;
-        alarm.min = minute;
+        ClockAlarmDbData alarm = alarmAt(hour, minute, weekdays);
         alarm.name = name;
         alarm.enable = on ? 1 : 0;
-        alarm.repeatWeekly = weekdays;
-        alarm.repeatOnce = weekdays == 0 ? 1 : 0;
-        alarm.timeZone = "Europe/Berlin";
-        ClockAlarmDbModel model;
-        alarm.id = model.reserveAlarmId();
-        ASSERT_TRUE(model.insertAlarmData(alarm));
+        storeAlarm(alarm);
     }
 };
 
@@ -89,18 +79,9 @@ TEST_P(SimulatorFaceTest, NoCities) {
 }
 
 TEST_P(SimulatorFaceTest, SeveralCities) {
-    std::vector<ClockWorldClockDbData> all;
-    ClockWorldClockDbModel().getWorldClockAllCityList(all);
-    int position = 0;
-    for (ClockWorldClockDbData& city : all) {
-        if (city.city == "IDS_CITY_NP_KATHMANDU" || city.city == "IDS_CITY_US_HAWAII_HONOLULU" ||
-            city.city == "IDS_CITY_BR_PARAIBA_JOAO_PESSOA") {
-            city.selected = 1;
-            city.position = position++;
-            ASSERT_TRUE(ClockWorldClockDbModel().updateWorldClockDbRecord(city));
-        }
-    }
-    ASSERT_GT(position, 1);
+    storeCity("IDS_CITY_US_HAWAII_HONOLULU", 0);
+    storeCity("IDS_CITY_BR_PARAIBA_JOAO_PESSOA", 1);
+    storeCity("IDS_CITY_NP_KATHMANDU", 2);
     stage().push(new WorldClockViewController(THEME));
     lookAtList(list(), "cities");
 }

@@ -17,6 +17,7 @@
 #include "support/ReadingSwitch.h"
 #include "support/ScreenReader.h"
 #include "support/ScreenTest.h"
+#include "support/StoredData.h"
 
 using simulator::AlarmListViewController;
 using simulator::QuickPanel;
@@ -46,36 +47,21 @@ protected:
         takeErrors();
         ScreenTest::TearDown();
     }
-    /** On Mondays. */
-    static void storeAlarm(int hour, int minute, const std::string& name, bool on) {
-        ClockAlarmDbData alarm;
-        alarm.leading = 0;
-        alarm.hour = hour;
-        alarm.min = minute;
+    static void storeNamed(int hour, int minute, const std::string& name, bool on) {
+        constexpr int MONDAY = 2;
+        ClockAlarmDbData alarm = alarmAt(hour, minute, MONDAY);
         alarm.name = name;
         alarm.enable = on ? 1 : 0;
-        alarm.repeatWeekly = 2;
-        alarm.repeatOnce = 0;
-        alarm.id = ClockAlarmDbModel().reserveAlarmId();
-        EXPECT_TRUE(ClockAlarmDbModel().insertAlarmData(alarm));
+        storeAlarm(alarm);
     }
     void openAlarms() {
         // An alarm that rings next would begin with the time until then.
-        storeAlarm(7, 30, "Gym", false);
+        storeNamed(7, 30, "Gym", false);
         stage().push(new AlarmListViewController(THEME));
     }
     void openCities() {
-        int position = 0;
-        for (const char* id : {KATHMANDU, SINGAPORE}) {
-            std::vector<ClockWorldClockDbData> all;
-            ClockWorldClockDbModel().getWorldClockAllCityList(all);
-            const auto found = std::find_if(all.begin(), all.end(),
-                                            [&](const auto& city) { return city.city == id; });
-            ASSERT_NE(found, all.end());
-            found->selected = 1;
-            found->position = position++;
-            EXPECT_TRUE(ClockWorldClockDbModel().updateWorldClockDbRecord(*found));
-        }
+        storeCity(KATHMANDU, 0);
+        storeCity(SINGAPORE, 1);
         stage().push(new WorldClockViewController(THEME));
     }
     static Names selected() {
@@ -250,8 +236,8 @@ INSTANTIATE_TEST_SUITE_P(Languages, ReadPagesSwitchTest, languageChanges(),
                          [](const auto& info) { return info.param.name; });
 
 TEST_P(ReadPagesSwitchTest, TheAlarmListsRowsSwitchesAndButtons) {
-    storeAlarm(7, 30, "Gym", false);
-    storeAlarm(22, 45, "", true);
+    storeNamed(7, 30, "Gym", false);
+    storeNamed(22, 45, "", true);
     expectTheSame([this] { stage().push(new AlarmListViewController(THEME)); });
 }
 
@@ -260,7 +246,7 @@ TEST_P(ReadPagesSwitchTest, TheWordsThatThereAreNoAlarms) {
 }
 
 TEST_P(ReadPagesSwitchTest, TheQuestionBeforeAnAlarmGoes) {
-    storeAlarm(7, 30, "Gym", false);
+    storeNamed(7, 30, "Gym", false);
     expectTheSame([this] {
         stage().push(new AlarmListViewController(THEME));
         const auto time = stage().findText("07:30");

@@ -15,13 +15,13 @@
 #include "ToastView.h"
 #include "WorldClockViewController.h"
 #include "base/Text.h"
-#include "clock/ClockAlarmDbModel.h"
 #include "clock/ClockStringUtil.h"
 #include "clock/ClockText.h"
 #include "clock/ClockWorldClockDbModel.h"
 #include "support/FaceInk.h"
 #include "support/LiveLanguage.h"
 #include "support/ScreenTest.h"
+#include "support/StoredData.h"
 #include "support/TextFaults.h"
 
 using testing::IsEmpty;
@@ -43,14 +43,6 @@ protected:
         ScreenTest::TearDown();
         _language.reset();
     }
-    static void storeAlarm() {
-        ClockAlarmDbData alarm{};
-        alarm.hour = 7;
-        alarm.min = 30;
-        alarm.enable = 1;
-        alarm.repeatWeekly = 126;
-        ClockAlarmDbModel().insertAlarmData(alarm);
-    }
     /** A title may slide. */
     std::vector<std::string> faults() {
         auto texts = stage().texts();
@@ -69,11 +61,8 @@ protected:
             return std::string_view(clockText(city.city.c_str())).size();
         });
         ASSERT_GE(all.size(), count);
-        for (std::size_t place = 0; place < count; ++place) {
-            all[place].selected = 1;
-            all[place].position = static_cast<int>(place) + 1;
-            EXPECT_TRUE(ClockWorldClockDbModel().updateWorldClockDbRecord(all[place]));
-        }
+        for (std::size_t place = 0; place < count; ++place)
+            storeCity(all[place].city, static_cast<int>(place) + 1);
     }
     static std::vector<std::string> longToasts() {
         const auto format = [](const char* id, const std::vector<base::FormatArgument>& arguments) {
@@ -98,7 +87,7 @@ private:
 };
 
 TEST_P(LanguagesTest, TheListOfAlarmsFollowsAndFits) {
-    storeAlarm();
+    storeAlarm(alarmAt(7, 30, 126));
     stage().push(new simulator::AlarmListViewController(THEME));
     choose();
     take("-alarms");

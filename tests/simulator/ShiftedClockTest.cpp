@@ -1,6 +1,5 @@
 // Screens that are open while the clock or the time zone is set.
 
-#include <algorithm>
 #include <string>
 #include <vector>
 
@@ -13,11 +12,10 @@
 #include "Foreground.h"
 #include "SettingEvents.h"
 #include "WorldClockViewController.h"
-#include "clock/ClockAlarmDbModel.h"
-#include "clock/ClockWorldClockDbModel.h"
 #include "control/DeviceActions.h"
 #include "device_settings.h"
 #include "support/ScreenTest.h"
+#include "support/StoredData.h"
 
 using simulator::AlarmListViewController;
 using simulator::WorldClockViewController;
@@ -216,14 +214,7 @@ TEST_F(ShiftedClockTest, aSettingThatCannotBeWatchedIsToldOf) {
 }
 
 TEST_F(ShiftedClockTest, theWorldClockFollowsTheClockTheZoneAndTheNewMinute) {
-    std::vector<ClockWorldClockDbData> all;
-    ClockWorldClockDbModel().getWorldClockAllCityList(all);
-    const auto city = std::find_if(all.begin(), all.end(), [](const auto& each) {
-        return each.city == "IDS_CITY_NP_KATHMANDU";
-    });
-    ASSERT_NE(city, all.end());
-    city->selected = 1;
-    ASSERT_TRUE(ClockWorldClockDbModel().updateWorldClockDbRecord(*city));
+    storeCity("IDS_CITY_NP_KATHMANDU");
     stage().push(new WorldClockViewController(THEME));
     ASSERT_THAT(face(), HasSubstr("14:26")) << "four hours and three quarters on";
     setClock("2026-11-18 23:59:50");
@@ -240,14 +231,9 @@ TEST_F(ShiftedClockTest, theWorldClockFollowsTheClockTheZoneAndTheNewMinute) {
 }
 
 TEST_F(ShiftedClockTest, theAlarmListIsDrawnAnew) {
-    ClockAlarmDbData alarm;
-    alarm.leading = 0;
-    alarm.hour = 6;
-    alarm.enable = 1;
-    alarm.repeatOnce = 1;
+    ClockAlarmDbData alarm = alarmAt(6, 0);
     alarm.autoDate = midnight(2026, 11, 19);
-    alarm.id = ClockAlarmDbModel().reserveAlarmId();
-    ASSERT_TRUE(ClockAlarmDbModel().insertAlarmData(alarm));
+    storeAlarm(alarm);
     stage().push(new AlarmListViewController(THEME));
     Evas_Object* before = stage().widgets("Elm_Genlist").front();
     setClock("2026-11-19 09:41:00");

@@ -14,10 +14,10 @@
 #include "QuickPanel.h"
 #include "ToastView.h"
 #include "VolumeView.h"
-#include "clock/ClockAlarmDbModel.h"
 #include "support/Look.h"
 #include "support/Ring.h"
 #include "support/ScreenTest.h"
+#include "support/StoredData.h"
 
 using simulator::AlarmListViewController;
 using simulator::QuickPanel;
@@ -45,16 +45,9 @@ protected:
         ScreenTest::TearDown();
     }
     static void store(int hour, int minute, int enable) {
-        ClockAlarmDbData alarm;
-        alarm.leading = 0;
-        alarm.hour = hour;
-        alarm.min = minute;
+        ClockAlarmDbData alarm = alarmAt(hour, minute, 62);
         alarm.enable = enable;
-        alarm.repeatWeekly = 62;
-        alarm.repeatOnce = 0;
-        ClockAlarmDbModel model;
-        alarm.id = model.reserveAlarmId();
-        ASSERT_TRUE(model.insertAlarmData(alarm));
+        storeAlarm(alarm);
     }
     Evas_Object* list() { return stage().widgets("Elm_Genlist").front(); }
     Elm_Object_Item* alarmRow(unsigned position) {

@@ -15,6 +15,7 @@
 #include "clock/ClockWorldClockDbModel.h"
 #include "screens/TestCatalogue.h"
 #include "support/ScreenTest.h"
+#include "support/StoredData.h"
 
 using simulator::AlarmListViewController;
 using simulator::WorldClockViewController;
@@ -51,20 +52,6 @@ protected:
     }
 
     void openPage() { stage().push(new WorldClockViewController(THEME)); }
-    static ClockWorldClockDbData cityOf(const std::string& id) {
-        std::vector<ClockWorldClockDbData> all;
-        ClockWorldClockDbModel().getWorldClockAllCityList(all);
-        const auto found =
-            std::find_if(all.begin(), all.end(), [&](const auto& city) { return city.city == id; });
-        EXPECT_NE(found, all.end()) << id;
-        return found == all.end() ? ClockWorldClockDbData() : *found;
-    }
-    static void select(const std::string& id, int position) {
-        ClockWorldClockDbData city = cityOf(id);
-        city.selected = 1;
-        city.position = position;
-        EXPECT_TRUE(ClockWorldClockDbModel().updateWorldClockDbRecord(city));
-    }
     static std::vector<std::string> selected() {
         std::vector<ClockWorldClockDbData> cities;
         ClockWorldClockDbModel().getWorldClockSelectedCityList(cities);
@@ -117,8 +104,8 @@ TEST_F(WorldClockPageTest, withoutCitiesItSaysSo) {
 }
 
 TEST_F(WorldClockPageTest, citiesAreInTheUsersOrderWithTheirTimes) {
-    select(KATHMANDU, 1);
-    select(SINGAPORE, 0);
+    storeCity(KATHMANDU, 1);
+    storeCity(SINGAPORE, 0);
     openPage();
     // It is 08:41 in Greenwich.
     EXPECT_THAT(shown({"Singapore", "Kathmandu"}), ElementsAre("Singapore", "Kathmandu"));
@@ -128,14 +115,14 @@ TEST_F(WorldClockPageTest, citiesAreInTheUsersOrderWithTheirTimes) {
 }
 
 TEST_F(WorldClockPageTest, everyTextOfACityLiesInsideTheCircle) {
-    select(SINGAPORE, 0);
+    storeCity(SINGAPORE, 0);
     openPage();
     for (const FoundText& found : stage().texts())
         EXPECT_TRUE(found.area.insideCircle()) << found.text;
 }
 
 TEST_F(WorldClockPageTest, theTimeFollowsTheSetting) {
-    select(SINGAPORE, 0);
+    storeCity(SINGAPORE, 0);
     openPage();
     device().setSetting(TIME_FORM, 1);
     ClockEventListener::raise(ClockEventListener::SETTINGS_CHANGED);
@@ -144,7 +131,7 @@ TEST_F(WorldClockPageTest, theTimeFollowsTheSetting) {
 }
 
 TEST_F(WorldClockPageTest, theTimeMovesOnWithEveryMinute) {
-    select(SINGAPORE, 0);
+    storeCity(SINGAPORE, 0);
     VirtualClock::setNow("Europe/Berlin", "2026-11-18 09:41:30");
     openPage();
     EXPECT_TRUE(stage().shows("16:41")) << readFace();
@@ -155,7 +142,7 @@ TEST_F(WorldClockPageTest, theTimeMovesOnWithEveryMinute) {
 }
 
 TEST_F(WorldClockPageTest, aClockThatWasSetShowsAtOnce) {
-    select(SINGAPORE, 0);
+    storeCity(SINGAPORE, 0);
     openPage();
     VirtualClock::jump(3 * 3600);
     ClockEventListener::raise(ClockEventListener::TIME_CHANGED);
@@ -164,7 +151,7 @@ TEST_F(WorldClockPageTest, aClockThatWasSetShowsAtOnce) {
 }
 
 TEST_F(WorldClockPageTest, aWatchThatComesBackShowsTheTimeOfNow) {
-    select(SINGAPORE, 0);
+    storeCity(SINGAPORE, 0);
     openPage();
     VirtualClock::jump(2 * 3600);
     ClockEventListener::raise(ClockEventListener::RESUMED);
@@ -173,14 +160,14 @@ TEST_F(WorldClockPageTest, aWatchThatComesBackShowsTheTimeOfNow) {
 }
 
 TEST_F(WorldClockPageTest, aCityOnAnotherDaySaysSo) {
-    select(HONOLULU, 0);
+    storeCity(HONOLULU, 0);
     openPage();
     EXPECT_THAT(readFace(), HasSubstr("Yesterday, GMT-10:00"));
     EXPECT_TRUE(stage().shows("22:41"));
 }
 
 TEST_F(WorldClockPageTest, aCityIsAddedThroughThePicker) {
-    select(SINGAPORE, 4);
+    storeCity(SINGAPORE, 4);
     openPage();
     tapText("Add city");
     ASSERT_TRUE(stage().shows("Cancel")) << readFace();
@@ -200,7 +187,7 @@ TEST_F(WorldClockPageTest, aCityThatIsAddedFarDownComesIntoView) {
     ClockWorldClockDbModel().getWorldClockAllCityList(all);
     for (std::size_t i = 0; i < 6; ++i) {
         if (all.at(i).city != KATHMANDU)
-            select(all.at(i).city, static_cast<int>(i));
+            storeCity(all.at(i).city, static_cast<int>(i));
     }
     openPage();
     EXPECT_THAT(shown({"Kathmandu"}), ElementsAre());
@@ -222,8 +209,8 @@ TEST_F(WorldClockPageTest, aPickerThatIsLeftAddsNothing) {
 }
 
 TEST_F(WorldClockPageTest, aCityIsRemovedOnceAPersonSaysSo) {
-    select(SINGAPORE, 0);
-    select(KATHMANDU, 1);
+    storeCity(SINGAPORE, 0);
+    storeCity(KATHMANDU, 1);
     openPage();
     tapCity("Singapore");
     EXPECT_TRUE(stage().shows("Remove")) << readFace();
@@ -235,7 +222,7 @@ TEST_F(WorldClockPageTest, aCityIsRemovedOnceAPersonSaysSo) {
 }
 
 TEST_F(WorldClockPageTest, aCityThatIsHeldIsAskedForToo) {
-    select(SINGAPORE, 0);
+    storeCity(SINGAPORE, 0);
     openPage();
     const auto time = stage().findText("16:41");
     ASSERT_TRUE(time);
@@ -250,7 +237,7 @@ TEST_F(WorldClockPageTest, aCityThatIsHeldIsAskedForToo) {
 }
 
 TEST_F(WorldClockPageTest, theLastCityThatGoesLeavesAnEmptyList) {
-    select(SINGAPORE, 0);
+    storeCity(SINGAPORE, 0);
     openPage();
     tapCity("Singapore");
     tapText("Remove");
@@ -258,7 +245,7 @@ TEST_F(WorldClockPageTest, theLastCityThatGoesLeavesAnEmptyList) {
 }
 
 TEST_F(WorldClockPageTest, cancelAndTheBackKeyKeepTheCity) {
-    select(SINGAPORE, 0);
+    storeCity(SINGAPORE, 0);
     openPage();
     tapCity("Singapore");
     tapText("Cancel");
@@ -273,7 +260,7 @@ TEST_F(WorldClockPageTest, cancelAndTheBackKeyKeepTheCity) {
 }
 
 TEST_F(WorldClockPageTest, aDamagedListIsLoggedAndLooksEmpty) {
-    select(SINGAPORE, 0);
+    storeCity(SINGAPORE, 0);
     for (const char* suffix : {"-wal", "-shm"})
         std::filesystem::remove(device().dataPath() + "world-clock-selection.db" + suffix);
     std::ofstream(device().dataPath() + "world-clock-selection.db") << std::string(4096, 'x');
@@ -291,7 +278,7 @@ TEST_F(WorldClockPageTest, theTitlesButtonLeadsThereAndBack) {
 }
 
 TEST_F(WorldClockPageTest, aLanguageChangeReachesEveryText) {
-    select(HONOLULU, 0);
+    storeCity(HONOLULU, 0);
     openPage();
     const TestCatalogue other({{HONOLULU, "Onolulu"},
                                {"IDS_WCL_HEADER_WORLD_CLOCK", "Ora mondiale"},
