@@ -9,6 +9,7 @@
 #include <app_assist/WContentViewController.h>
 
 #include "AlarmDiscardPopupViewController.h"
+#include "screens/PageBelow.h"
 #include "support/LiveObjects.h"
 #include "support/ScreenTest.h"
 
@@ -18,23 +19,10 @@ using testing::HasSubstr;
 
 namespace {
 
-/** Takes the back key if nothing nearer does. */
-class BackPage : public app_assist::WContentViewController {
-public:
-    bool onPop() override {
-        ++pops;
-        return false;
-    }
-    int pops = 0;
-
-protected:
-    Evas_Object* onCreateView(Evas_Object* parent, void*) override { return elm_label_add(parent); }
-};
-
 class DiscardPopupTest : public ScreenTest {
 protected:
     void show() {
-        page = new BackPage;
+        page = new PageBelow;
         stage().push(page);
         popup = new AlarmDiscardPopupViewController;
         popup->setDiscardBtnSelectedCb([this] { ++discards; });
@@ -43,7 +31,7 @@ protected:
         stage().settle();
     }
 
-    BackPage* page = nullptr;
+    PageBelow* page = nullptr;
     AlarmDiscardPopupViewController* popup = nullptr;
     app_assist::WWeakPtr<app_assist::WViewController> alive;
     int discards = 0;

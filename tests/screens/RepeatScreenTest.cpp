@@ -12,6 +12,7 @@
 #include "AlarmRepeatViewController.h"
 #include "AlarmRepeatViewItem.h"
 #include "screens/EmittedSignals.h"
+#include "screens/PageBelow.h"
 #include "screens/TestCatalogue.h"
 #include "support/ScreenTest.h"
 
@@ -24,23 +25,6 @@ const char* const LABELS[] = {"Every day",     "Every Sunday",    "Every Monday"
                               "Every Tuesday", "Every Wednesday", "Every Thursday",
                               "Every Friday",  "Every Saturday"};
 constexpr int ROWS = 8;
-
-/** The page below; counts the requests to leave it. */
-class PageBelow : public app_assist::WContentViewController {
-public:
-    bool onPop() override {
-        ++pops;
-        return false;
-    }
-    int pops = 0;
-
-protected:
-    Evas_Object* onCreateView(Evas_Object* parent, void*) override {
-        Evas_Object* const label = elm_label_add(parent);
-        elm_object_text_set(label, "Page below");
-        return label;
-    }
-};
 
 class RepeatScreenTest : public ScreenTest {
 protected:

@@ -13,6 +13,7 @@
 #include "AlarmTypePopupViewController.h"
 #include "AlarmTypePopupViewItem.h"
 #include "screens/EmittedSignals.h"
+#include "screens/PageBelow.h"
 #include "screens/TestCatalogue.h"
 #include "support/ScreenTest.h"
 
@@ -22,19 +23,6 @@ using testing::IsEmpty;
 namespace {
 
 const char* const LABELS[] = {"Sound", "Vibration", "Vibration and sound"};
-
-/** The page below; counts the requests to leave it. */
-class PageBelow : public app_assist::WContentViewController {
-public:
-    bool onPop() override {
-        ++pops;
-        return false;
-    }
-    int pops = 0;
-
-protected:
-    Evas_Object* onCreateView(Evas_Object* parent, void*) override { return elm_label_add(parent); }
-};
 
 class TypePopupTest : public ScreenTest {
 protected:
