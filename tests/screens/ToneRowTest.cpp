@@ -1,7 +1,5 @@
 // The editor's row for the tone.
 
-#include <cstdlib>
-#include <memory>
 #include <string>
 #include <vector>
 
@@ -11,9 +9,8 @@
 #include <device/dlog.h>
 
 #include "AlarmToneItem.h"
-#include "screens/RowPage.h"
 #include "screens/TestCatalogue.h"
-#include "support/ScreenTest.h"
+#include "screens/TextRowFixture.h"
 #include "support/ToneFake.h"
 
 using testing::ElementsAre;
@@ -26,37 +23,20 @@ constexpr const char* TITLE_PART = "elm.text.main.left.top";
 constexpr const char* NAME_PART = "elm.text.sub.left.bottom";
 constexpr const char* NO_FILE = "There is no Tone File !! Set default Tone File(Alarm_Impatient)";
 
-class ToneRowTest : public ScreenTest {
+class ToneRowTest : public TextRowFixture<AlarmToneItem> {
 protected:
     void SetUp() override {
-        ScreenTest::SetUp();
+        TextRowFixture::SetUp();
         device().clearCalls();
     }
     void TearDown() override {
         EXPECT_EQ(tones::unreleased(), 0U);
-        ScreenTest::TearDown();
+        TextRowFixture::TearDown();
     }
 
-    void show() {
-        row = new AlarmToneItem(alarm);
-        row->setSelectedCb([this] { ++selections; });
-        page = new RowPage(row);
-        stage().push(page);
-    }
     void showTone(const std::string& path) {
         alarm.soundPath = path;
         show();
-    }
-
-    std::vector<std::string> texts() { return Stage::rows(page->genlist()).front().texts; }
-
-    /** What the row answers for a part; "(null)" for nothing. */
-    std::string answer(const char* part) {
-        const std::unique_ptr<Elm_Genlist_Item_Class, decltype(&elm_genlist_item_class_free)>
-            itemClass(row->getItemClassNew(), &elm_genlist_item_class_free);
-        const std::unique_ptr<char, decltype(&std::free)> text(
-            itemClass->func.text_get(row, page->genlist(), part), &std::free);
-        return text ? text.get() : "(null)";
     }
 
     /** The name of a tone in a buffer of its own. */
@@ -83,11 +63,6 @@ protected:
         std::erase_if(calls, [](const auto& call) { return !call.starts_with("metadata_"); });
         return calls;
     }
-
-    ClockAlarmDbData alarm{};
-    AlarmToneItem* row = nullptr;
-    RowPage* page = nullptr;
-    int selections = 0;
 };
 
 // What it shows.
@@ -196,13 +171,6 @@ TEST_F(ToneRowTest, ALongPathIsCutBeforeItIsRead) {
     EXPECT_EQ(alarm.soundPath, path);
 }
 
-TEST_F(ToneRowTest, ServesNoOtherPart) {
-    show();
-    for (const char* part : {"elm.text", "elm.text.main.left", "elm.icon.2", ""})
-        EXPECT_EQ(answer(part), "(null)") << part;
-    EXPECT_EQ(answer(nullptr), "(null)");
-}
-
 // How it reads the title.
 
 TEST_F(ToneRowTest, AsksTheFileForItsTitle) {
@@ -286,17 +254,6 @@ TEST_F(ToneRowTest, BadArgumentsAreRefused) {
 
 // The row in its list.
 
-TEST_F(ToneRowTest, EachItemClassIsANewOneOfTheTwoLineStyle) {
-    show();
-    Elm_Genlist_Item_Class* const one = row->getItemClassNew();
-    Elm_Genlist_Item_Class* const other = row->getItemClassNew();
-    EXPECT_NE(one, other);
-    EXPECT_STREQ(one->item_style, "2line.top");
-    EXPECT_EQ(one->func.content_get, nullptr);
-    elm_genlist_item_class_free(one);
-    elm_genlist_item_class_free(other);
-}
-
 TEST_F(ToneRowTest, EveryTapCounts) {
     show();
     stage().tapText("Alarm tone");
@@ -304,40 +261,6 @@ TEST_F(ToneRowTest, EveryTapCounts) {
     EXPECT_FALSE(elm_genlist_item_selected_get(page->item()));
     stage().tapText("Alarm_Impatient");
     EXPECT_EQ(selections, 2);
-}
-
-TEST_F(ToneRowTest, TheLastFunctionCounts) {
-    show();
-    row->setSelectedCb([this] { selections += 10; });
-    stage().tapRow(page->item());
-    EXPECT_EQ(selections, 10);
-}
-
-TEST_F(ToneRowTest, WithoutAFunctionATapDoesNothing) {
-    show();
-    row->setSelectedCb(nullptr);
-    stage().tapRow(page->item());
-    row->onSelect(nullptr);
-    EXPECT_EQ(selections, 0);
-}
-
-TEST_F(ToneRowTest, GoesWithItsListItem) {
-    show();
-    const auto held = std::make_shared<int>(0);
-    row->setSelectedCb([held] { ++*held; });
-    EXPECT_EQ(held.use_count(), 2);
-    elm_object_item_del(page->item());
-    stage().settle();
-    EXPECT_EQ(held.use_count(), 1);
-}
-
-TEST_F(ToneRowTest, AMissingRowIsLogged) {
-    show();
-    Elm_Genlist_Item_Class* const itemClass = row->getItemClassNew();
-    EXPECT_EQ(itemClass->func.text_get(nullptr, page->genlist(), TITLE_PART), nullptr);
-    itemClass->func.del(nullptr, page->genlist());
-    elm_genlist_item_class_free(itemClass);
-    expectLog("Data is NULL !!");
 }
 
 } // namespace

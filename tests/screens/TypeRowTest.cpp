@@ -1,47 +1,20 @@
 // The editor's row for the alert type.
 
 #include <climits>
-#include <cstdlib>
-#include <memory>
 #include <string>
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
 #include "AlarmTypeItem.h"
-#include "screens/RowPage.h"
 #include "screens/TestCatalogue.h"
-#include "support/ScreenTest.h"
+#include "screens/TextRowFixture.h"
 
 using testing::ElementsAre;
 
 namespace {
 
-class TypeRowTest : public ScreenTest {
-protected:
-    void show() {
-        row = new AlarmTypeItem(alarm);
-        row->setSelectedCb([this] { ++selections; });
-        page = new RowPage(row);
-        stage().push(page);
-    }
-
-    std::vector<std::string> texts() { return Stage::rows(page->genlist()).front().texts; }
-
-    /** What the row answers for a part; "(null)" for nothing. */
-    std::string answer(const char* part) {
-        const std::unique_ptr<Elm_Genlist_Item_Class, decltype(&elm_genlist_item_class_free)>
-            itemClass(row->getItemClassNew(), &elm_genlist_item_class_free);
-        const std::unique_ptr<char, decltype(&std::free)> text(
-            itemClass->func.text_get(row, page->genlist(), part), &std::free);
-        return text ? text.get() : "(null)";
-    }
-
-    ClockAlarmDbData alarm{};
-    AlarmTypeItem* row = nullptr;
-    RowPage* page = nullptr;
-    int selections = 0;
-};
+using TypeRowTest = TextRowFixture<AlarmTypeItem>;
 
 TEST_F(TypeRowTest, NamesTheTypeOfTheRecord) {
     show();
@@ -66,30 +39,12 @@ TEST_F(TypeRowTest, AnUnknownTypeHasNoName) {
     }
 }
 
-TEST_F(TypeRowTest, ServesNoOtherPart) {
-    show();
-    for (const char* part : {"elm.text", "elm.text.main.left", "elm.icon.2", ""})
-        EXPECT_EQ(answer(part), "(null)") << part;
-    EXPECT_EQ(answer(nullptr), "(null)");
-}
-
 TEST_F(TypeRowTest, FormatsInTranslationsAreOnlyText) {
     show();
     const TestCatalogue hostile{{"IDS_ALM_BODY_SOUND", "%n"},
                                 {"IDS_CLOCK_TMBODY_ALARM_TYPE", "%s%s"}};
     EXPECT_EQ(answer("elm.text.sub.left.bottom"), "%n");
     EXPECT_EQ(answer("elm.text.main.left.top"), "%s%s");
-}
-
-TEST_F(TypeRowTest, EachItemClassIsANewOneOfTheTwoLineStyle) {
-    show();
-    Elm_Genlist_Item_Class* const one = row->getItemClassNew();
-    Elm_Genlist_Item_Class* const other = row->getItemClassNew();
-    EXPECT_NE(one, other);
-    EXPECT_STREQ(one->item_style, "2line.top");
-    EXPECT_EQ(one->func.content_get, nullptr);
-    elm_genlist_item_class_free(one);
-    elm_genlist_item_class_free(other);
 }
 
 TEST_F(TypeRowTest, EveryTapCounts) {
@@ -100,31 +55,6 @@ TEST_F(TypeRowTest, EveryTapCounts) {
     stage().tapText("Sound");
     EXPECT_EQ(selections, 2);
     EXPECT_EQ(alarm.type, 0);
-}
-
-TEST_F(TypeRowTest, TheLastFunctionCounts) {
-    show();
-    row->setSelectedCb([this] { selections += 10; });
-    stage().tapRow(page->item());
-    EXPECT_EQ(selections, 10);
-}
-
-TEST_F(TypeRowTest, WithoutAFunctionATapDoesNothing) {
-    show();
-    row->setSelectedCb(nullptr);
-    stage().tapRow(page->item());
-    row->onSelect(nullptr);
-    EXPECT_EQ(selections, 0);
-}
-
-TEST_F(TypeRowTest, AMissingRowIsLogged) {
-    show();
-    Elm_Genlist_Item_Class* const itemClass = row->getItemClassNew();
-    EXPECT_EQ(itemClass->func.text_get(nullptr, page->genlist(), "elm.text.main.left.top"),
-              nullptr);
-    itemClass->func.del(nullptr, page->genlist());
-    elm_genlist_item_class_free(itemClass);
-    expectLog("Data is NULL !!");
 }
 
 } // namespace
