@@ -6,6 +6,7 @@
 #include <string>
 #include <vector>
 
+#include "ButtonBelow.h"
 #include "device/eext.h"
 #include "support/ScreenTest.h"
 
@@ -82,20 +83,13 @@ TEST_F(QuickPanelTest, aTouchSendsItUp) {
 }
 
 TEST_F(QuickPanelTest, itKeepsTouchesFromWhatItCovers) {
-    Evas_Object* button = elm_button_add(stage().window());
-    evas_object_resize(button, Stage::SIZE, Stage::SIZE);
-    evas_object_show(button);
-    int clicks = 0;
-    evas_object_smart_callback_add(
-        button, "clicked", [](void* count, Evas_Object*, void*) { ++*static_cast<int*>(count); },
-        &clicks);
+    const ButtonBelow button(stage().window());
     pullDown();
     stage().tap(180, 180);
-    EXPECT_EQ(clicks, 0);
+    EXPECT_EQ(button.clicks(), 0);
     Stage::advance(0.5);
     stage().tap(180, 180);
-    EXPECT_EQ(clicks, 1) << "below it once it is up";
-    evas_object_del(button);
+    EXPECT_EQ(button.clicks(), 1) << "below it once it is up";
 }
 
 TEST_F(QuickPanelTest, theBackKeySendsItUpAndNothingElse) {

@@ -6,6 +6,7 @@
 
 #include <gmock/gmock.h>
 
+#include "ButtonBelow.h"
 #include "support/LiveLanguage.h"
 #include "support/ScreenTest.h"
 #include "support/TextFaults.h"
@@ -100,18 +101,11 @@ TEST_F(ToastViewTest, aLongToastStaysInsideTheCircle) {
 
 TEST_F(ToastViewTest, aToastLetsInputThrough) {
     ToastView toasts(stage().window(), THEME);
-    Evas_Object* button = elm_button_add(stage().window());
-    evas_object_resize(button, Stage::SIZE, Stage::SIZE);
-    evas_object_show(button);
-    int clicks = 0;
-    evas_object_smart_callback_add(
-        button, "clicked", [](void* count, Evas_Object*, void*) { ++*static_cast<int*>(count); },
-        &clicks);
+    const ButtonBelow button(stage().window());
     toasts.post("Above the button");
     Stage::advance(1);
     stage().tap(180, 280);
-    EXPECT_EQ(clicks, 1);
-    evas_object_del(button);
+    EXPECT_EQ(button.clicks(), 1);
 }
 
 TEST_F(ToastViewTest, aViewThatGoesWithAToastLeavesNothingBehind) {

@@ -4,6 +4,7 @@
 
 #include <string>
 
+#include "ButtonBelow.h"
 #include "support/ScreenTest.h"
 
 using simulator::setVolumeLevel;
@@ -80,18 +81,11 @@ TEST_F(VolumeViewTest, theBarGrowsOnAMirroredFaceToo) {
 
 TEST_F(VolumeViewTest, itLetsInputThrough) {
     VolumeView view(stage().window(), THEME);
-    Evas_Object* button = elm_button_add(stage().window());
-    evas_object_resize(button, Stage::SIZE, Stage::SIZE);
-    evas_object_show(button);
-    int clicks = 0;
-    evas_object_smart_callback_add(
-        button, "clicked", [](void* count, Evas_Object*, void*) { ++*static_cast<int*>(count); },
-        &clicks);
+    const ButtonBelow button(stage().window());
     view.show(3);
     Stage::advance(0.5);
     stage().tap(180, 64);
-    EXPECT_EQ(clicks, 1);
-    evas_object_del(button);
+    EXPECT_EQ(button.clicks(), 1);
 }
 
 TEST_F(VolumeViewTest, aViewThatGoesWhileItShowsLeavesNothingBehind) {
