@@ -8,6 +8,7 @@
 #include "screens/EditorFixture.h"
 #include "screens/TestCatalogue.h"
 #include "support/LiveObjects.h"
+#include "support/StoredData.h"
 
 using testing::Contains;
 using testing::ElementsAre;
@@ -25,14 +26,6 @@ protected:
 
     Evas_Object* dateButton() {
         return elm_object_part_content_get(timePickerRow().getCalendarObj(), "date.button");
-    }
-
-    /** An alarm that is not in the store. */
-    static ClockAlarmDbData anAlarm(int hour, int minute) {
-        ClockAlarmDbData alarm{};
-        alarm.hour = hour;
-        alarm.min = minute;
-        return alarm;
     }
 
     static ClockAlarmDbData onDay(ClockAlarmDbData alarm, const std::string& day) {
@@ -89,7 +82,7 @@ TEST_F(DatePopupEditorTest, ItOpensOnTheDayThatTheWheelsLedTo) {
 }
 
 TEST_F(DatePopupEditorTest, ItOpensOnTheDayThatTheLineTells) {
-    editAlarm(anAlarm(7, 0));
+    editAlarm(alarmAt(7, 0));
     ClockEventListener::raise(ClockEventListener::LANGUAGE_CHANGED);
     stage().settle();
     ASSERT_EQ(dateText(), "Tomorrow - Thu, Nov 19");
@@ -98,7 +91,7 @@ TEST_F(DatePopupEditorTest, ItOpensOnTheDayThatTheLineTells) {
 }
 
 TEST_F(DatePopupEditorTest, ItOpensOnTheAlarmsDate) {
-    editAlarm(onDay(anAlarm(7, 0), "2027-03-28"));
+    editAlarm(onDay(alarmAt(7, 0), "2027-03-28"));
     openPopup();
     EXPECT_EQ(face().selectedDay(), "2027-03-28");
 }
@@ -195,7 +188,7 @@ TEST_F(DatePopupEditorTest, ItGoesWithTheWindow) {
 }
 
 TEST_F(DatePopupEditorTest, AfterSetTheRepeatRowReadsNever) {
-    ClockAlarmDbData alarm = anAlarm(7, 0);
+    ClockAlarmDbData alarm = alarmAt(7, 0);
     alarm.repeatOnce = 0;
     alarm.repeatWeekly = 62;
     editAlarm(alarm);
@@ -206,7 +199,7 @@ TEST_F(DatePopupEditorTest, AfterSetTheRepeatRowReadsNever) {
 }
 
 TEST_F(DatePopupEditorTest, AfterAPastChoiceTheRepeatRowReadsNever) {
-    ClockAlarmDbData alarm = anAlarm(7, 0);
+    ClockAlarmDbData alarm = alarmAt(7, 0);
     alarm.repeatOnce = 0;
     alarm.repeatWeekly = 62;
     editAlarm(alarm);
@@ -284,7 +277,7 @@ TEST_F(DatePopupEditorTest, TheMinutesGoOnWhileItIsOpen) {
 }
 
 TEST_F(DatePopupEditorTest, ALanguageChangeReachesItAndTheRowBelow) {
-    editAlarm(onDay(anAlarm(7, 0), "2026-11-25"));
+    editAlarm(onDay(alarmAt(7, 0), "2026-11-25"));
     openPopup();
     const TestCatalogue french{{"IDS_COM_SK_SET", "Régler"}, {"IDS_COM_SK_CANCEL", "Annuler"}};
     ClockEventListener::raise(ClockEventListener::LANGUAGE_CHANGED);

@@ -4,19 +4,12 @@
 #include "screens/EditorFixture.h"
 #include "screens/TestCatalogue.h"
 #include "support/LiveObjects.h"
+#include "support/StoredData.h"
 
 namespace {
 
 class EditorDateLineTest : public EditorFixture {
 protected:
-    /** An alarm that is not in the store. */
-    static ClockAlarmDbData anAlarm(int hour, int minute) {
-        ClockAlarmDbData alarm{};
-        alarm.hour = hour;
-        alarm.min = minute;
-        return alarm;
-    }
-
     /** On the repeat screen, and comes back. */
     void flipMonday() {
         stage().tapRow(elm_genlist_item_next_get(elm_genlist_first_item_get(genlist())));
@@ -35,53 +28,53 @@ protected:
 };
 
 TEST_F(EditorDateLineTest, ALaterTimeIsToday) {
-    editAlarm(anAlarm(9, 42));
+    editAlarm(alarmAt(9, 42));
     EXPECT_EQ(lineOnLanguageChange(), "Today - Wed, Nov 18");
 }
 
 TEST_F(EditorDateLineTest, TheCurrentMinuteIsTomorrow) {
-    editAlarm(anAlarm(9, 41));
+    editAlarm(alarmAt(9, 41));
     EXPECT_EQ(lineOnLanguageChange(), "Tomorrow - Thu, Nov 19");
 }
 
 TEST_F(EditorDateLineTest, AtSevenAnAlarmForSevenIsTomorrow) {
     VirtualClock::setNow("Europe/Berlin", "2026-11-18 07:00:00");
-    editAlarm(anAlarm(7, 0));
+    editAlarm(alarmAt(7, 0));
     EXPECT_EQ(lineOnLanguageChange(), "Tomorrow - Thu, Nov 19");
 }
 
 TEST_F(EditorDateLineTest, AnEarlierHourIsTomorrow) {
-    editAlarm(anAlarm(8, 59));
+    editAlarm(alarmAt(8, 59));
     EXPECT_EQ(lineOnLanguageChange(), "Tomorrow - Thu, Nov 19");
 }
 
 TEST_F(EditorDateLineTest, ALaterHourIsTodayWhateverTheMinute) {
-    editAlarm(anAlarm(10, 0));
+    editAlarm(alarmAt(10, 0));
     EXPECT_EQ(lineOnLanguageChange(), "Today - Wed, Nov 18");
 }
 
 TEST_F(EditorDateLineTest, RepeatDaysAreListedFromMondayToSunday) {
-    ClockAlarmDbData alarm = anAlarm(7, 0);
+    ClockAlarmDbData alarm = alarmAt(7, 0);
     alarm.repeatWeekly = 3;
     editAlarm(alarm);
     EXPECT_EQ(lineOnLanguageChange(), "Mon Sun ");
 }
 
 TEST_F(EditorDateLineTest, AllDaysAreEveryDay) {
-    ClockAlarmDbData alarm = anAlarm(7, 0);
+    ClockAlarmDbData alarm = alarmAt(7, 0);
     alarm.repeatWeekly = 127;
     editAlarm(alarm);
     EXPECT_EQ(lineOnLanguageChange(), "Every day");
 }
 
 TEST_F(EditorDateLineTest, ALineOfTranslationsIsCutAtOneKilobyte) {
-    editAlarm(anAlarm(10, 0));
+    editAlarm(alarmAt(10, 0));
     const TestCatalogue wordy{{"IDS_CLOCK_BODY_TODAY", std::string(1022, 'x') + "ä"}};
     EXPECT_EQ(lineOnLanguageChange(), std::string(1022, 'x'));
 }
 
 TEST_F(EditorDateLineTest, ALineOfRepeatDaysTakesAllOfThem) {
-    ClockAlarmDbData alarm = anAlarm(7, 0);
+    ClockAlarmDbData alarm = alarmAt(7, 0);
     alarm.repeatWeekly = 62;
     editAlarm(alarm);
     const TestCatalogue wordy{{"IDS_CLOCK_SBODY_MON_ABB2", std::string(70, 'm')},
@@ -93,31 +86,31 @@ TEST_F(EditorDateLineTest, ALineOfRepeatDaysTakesAllOfThem) {
 TEST_F(EditorDateLineTest, TheSundayNightBeforeALongDayStaysOnIt) {
     // 86400 seconds later it is still the day on which the clocks went back.
     VirtualClock::setNow("Europe/Berlin", "2026-10-25 00:30:00");
-    editAlarm(anAlarm(0, 10));
+    editAlarm(alarmAt(0, 10));
     EXPECT_EQ(lineOnLanguageChange(), "Tomorrow - Sun, Oct 25");
 }
 
 TEST_F(EditorDateLineTest, TheLateEveningBeforeAShortDaySkipsIt) {
     VirtualClock::setNow("Europe/Berlin", "2026-03-28 23:30:00");
-    editAlarm(anAlarm(6, 0));
+    editAlarm(alarmAt(6, 0));
     EXPECT_EQ(lineOnLanguageChange(), "Tomorrow - Mon, Mar 30");
 }
 
 TEST_F(EditorDateLineTest, ThePickedDateReturnsWhenTheRowIsMadeAnew) {
-    ClockAlarmDbData alarm = anAlarm(7, 0);
+    ClockAlarmDbData alarm = alarmAt(7, 0);
     alarm.autoDate = alarm.manualDate = static_cast<std::int32_t>(at("2026-12-24 00:00:00"));
     editAlarm(alarm);
     EXPECT_EQ(lineOnLanguageChange(), "Thu, Dec 24");
 }
 
 TEST_F(EditorDateLineTest, TheRepeatScreenBringsTheDays) {
-    editAlarm(anAlarm(7, 0));
+    editAlarm(alarmAt(7, 0));
     flipMonday();
     EXPECT_EQ(dateText(), "Mon ");
 }
 
 TEST_F(EditorDateLineTest, TheRepeatScreenWithoutDaysBringsTheNextRing) {
-    ClockAlarmDbData alarm = anAlarm(7, 0);
+    ClockAlarmDbData alarm = alarmAt(7, 0);
     alarm.repeatWeekly = 2;
     editAlarm(alarm);
     flipMonday();
@@ -212,7 +205,7 @@ TEST_F(EditorMinuteTimerTest, AnHourThatComesTwiceBringsTodayBack) {
 
 TEST_F(EditorMinuteTimerTest, APickedDateStaysAsItReadsAtMidnight) {
     VirtualClock::setNow("Europe/Berlin", "2026-11-18 23:59:30");
-    ClockAlarmDbData alarm = anAlarm(7, 0);
+    ClockAlarmDbData alarm = alarmAt(7, 0);
     alarm.autoDate = alarm.manualDate = static_cast<std::int32_t>(at("2026-11-19 00:00:00"));
     editAlarm(alarm);
     EXPECT_EQ(dateText(), "Tomorrow - Thu, Nov 19");
@@ -224,7 +217,7 @@ TEST_F(EditorMinuteTimerTest, APickedDateStaysAsItReadsAtMidnight) {
 }
 
 TEST_F(EditorMinuteTimerTest, RepeatDaysStayAsTheyRead) {
-    ClockAlarmDbData alarm = anAlarm(9, 42);
+    ClockAlarmDbData alarm = alarmAt(9, 42);
     alarm.repeatWeekly = 8;
     editAlarm(alarm);
     Stage::advance(61);
@@ -283,7 +276,7 @@ TEST_F(EditorMinuteTimerTest, LeavingEndsTheTimer) {
 }
 
 TEST_F(EditorMinuteTimerTest, ThePickedDateSurvivesTheMinute) {
-    ClockAlarmDbData alarm = anAlarm(7, 0);
+    ClockAlarmDbData alarm = alarmAt(7, 0);
     alarm.autoDate = alarm.manualDate = static_cast<std::int32_t>(at("2026-12-24 00:00:00"));
     editAlarm(alarm);
     Stage::advance(61);
@@ -381,7 +374,7 @@ TEST_F(EditorUndatedLineTest, TodayFromTheDatePopupFollowsTheMinute) {
 }
 
 TEST_F(EditorUndatedLineTest, ALineWithoutRepeatDaysFollowsAClockThatIsSet) {
-    ClockAlarmDbData alarm = anAlarm(9, 42);
+    ClockAlarmDbData alarm = alarmAt(9, 42);
     alarm.repeatWeekly = 2;
     editAlarm(alarm);
     flipMonday();
@@ -391,7 +384,7 @@ TEST_F(EditorUndatedLineTest, ALineWithoutRepeatDaysFollowsAClockThatIsSet) {
 }
 
 TEST_F(EditorUndatedLineTest, ARepairedLineFollowsAClockThatIsSet) {
-    ClockAlarmDbData alarm = anAlarm(7, 0);
+    ClockAlarmDbData alarm = alarmAt(7, 0);
     alarm.autoDate = alarm.manualDate = static_cast<std::int32_t>(at("2026-11-17 00:00:00"));
     editAlarm(alarm);
     expectLog("Set autoDate and manualDate to 0. Time already passed !!");
@@ -403,7 +396,7 @@ TEST_F(EditorUndatedLineTest, ARepairedLineFollowsAClockThatIsSet) {
 }
 
 TEST_F(EditorUndatedLineTest, RepeatDaysStayWhateverTheTime) {
-    ClockAlarmDbData alarm = anAlarm(7, 0);
+    ClockAlarmDbData alarm = alarmAt(7, 0);
     alarm.repeatWeekly = 62;
     editAlarm(alarm);
     EXPECT_EQ(lineAfter(ClockEventListener::RESUMED, "2026-11-20 12:00:00"),
@@ -428,7 +421,7 @@ TEST_F(EditorUndatedLineTest, RepeatDaysOutliveTheDayThatTheWheelsHadBrought) {
 }
 
 TEST_F(EditorUndatedLineTest, RepeatDaysOutliveAPickedDayThatIsOver) {
-    ClockAlarmDbData alarm = anAlarm(7, 0);
+    ClockAlarmDbData alarm = alarmAt(7, 0);
     alarm.autoDate = alarm.manualDate = static_cast<std::int32_t>(at("2026-11-19 00:00:00"));
     editAlarm(alarm);
     flipMonday();

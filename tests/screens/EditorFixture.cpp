@@ -10,6 +10,8 @@
 #include <clock/ClockAlarmDbModel.h>
 #include <clock/ClockAlarmManagerModel.h>
 
+#include "AlarmTypeItem.h"
+
 namespace {
 
 int exits = 0;
@@ -28,7 +30,7 @@ bool isNameLine(const std::string& line) {
     return line == "Alarm Name is NULL !!" || line == "Focus is not set for entry !!";
 }
 
-app_assist::WGenlistItem* rowOf(Elm_Object_Item* item) {
+app_assist::WGenlistItem* rowBehind(Elm_Object_Item* item) {
     return static_cast<app_assist::WGenlistItem*>(elm_object_item_data_get(item));
 }
 
@@ -124,11 +126,11 @@ Evas_Object* EditorFixture::genlist() {
 }
 
 AlarmTimePickerItem& EditorFixture::timePickerRow() {
-    return *static_cast<AlarmTimePickerItem*>(rowOf(elm_genlist_first_item_get(genlist())));
+    return *static_cast<AlarmTimePickerItem*>(rowBehind(elm_genlist_first_item_get(genlist())));
 }
 
 AlarmNameItem& EditorFixture::nameRow() {
-    return *static_cast<AlarmNameItem*>(rowOf(elm_genlist_last_item_get(genlist())));
+    return *static_cast<AlarmNameItem*>(rowBehind(elm_genlist_last_item_get(genlist())));
 }
 
 std::string EditorFixture::dateText() {
@@ -150,6 +152,12 @@ void EditorFixture::typeName(const std::string& name) {
     stage().tap(nameRow().getNameEntryObj());
     stage().settle();
     stage().type(name);
+    stage().settle();
+}
+
+void EditorFixture::chooseType(const std::string& label) {
+    tapRow<AlarmTypeItem>();
+    stage().tapText(label);
     stage().settle();
 }
 

@@ -46,6 +46,17 @@ protected:
     bool asksToDiscard() { return stage().shows("Discard changes"); }
     AlarmEditViewController& editor() { return *_editor; }
     Evas_Object* genlist();
+    /** The row of a kind; null when there is none. */
+    template <class RowClass>
+    RowClass* rowOf() {
+        for (Elm_Object_Item* item = elm_genlist_first_item_get(genlist()); item;
+             item = elm_genlist_item_next_get(item)) {
+            if (auto* found = dynamic_cast<RowClass*>(
+                    static_cast<app_assist::WGenlistItem*>(elm_object_item_data_get(item))))
+                return found;
+        }
+        return nullptr;
+    }
     AlarmTimePickerItem& timePickerRow();
     AlarmNameItem& nameRow();
     Evas_Object* picker() { return timePickerRow().getDateTimeObj(); }
@@ -54,6 +65,14 @@ protected:
     void pick(int hour, int minute);
     /** Scrolls to the name, taps it and types. */
     void typeName(const std::string& name);
+    /** Goes to a row and taps it. */
+    template <class RowClass>
+    void tapRow() {
+        stage().tapRow(rowOf<RowClass>()->getElmObjectItem());
+        stage().settle();
+    }
+    /** Chooses an alert type by its label. */
+    void chooseType(const std::string& label);
     void tapCancel() { tapTitle("Cancel"); }
     void tapDone() { tapTitle("Done"); }
     /** Taps a button of the popup, which is nearer than a title button of that name. */

@@ -29,17 +29,6 @@ const std::vector<std::string> SOUND_ROWS = {"time",   "repeat",          "type"
 
 class EditorRowsTest : public EditorFixture {
 protected:
-    template <class RowClass>
-    RowClass* row() {
-        for (Elm_Object_Item* item = elm_genlist_first_item_get(genlist()); item;
-             item = elm_genlist_item_next_get(item)) {
-            if (auto* found = dynamic_cast<RowClass*>(
-                    static_cast<app_assist::WGenlistItem*>(elm_object_item_data_get(item))))
-                return found;
-        }
-        return nullptr;
-    }
-
     static std::string kindOf(app_assist::WGenlistItem* row) {
         if (dynamic_cast<AlarmTimePickerItem*>(row))
             return "time";
@@ -68,13 +57,8 @@ protected:
     }
 
     template <class RowClass>
-    void tapRow() {
-        stage().tapRow(row<RowClass>()->getElmObjectItem());
-        stage().settle();
-    }
-    template <class RowClass>
     std::vector<std::string> textsOf() {
-        Elm_Object_Item* const item = row<RowClass>()->getElmObjectItem();
+        Elm_Object_Item* const item = rowOf<RowClass>()->getElmObjectItem();
         stage().showRow(item);
         for (const Row& shown : Stage::rows(genlist())) {
             if (shown.item == item)
@@ -86,7 +70,7 @@ protected:
     /** The switch of a row, scrolled into view. */
     template <class RowClass>
     Evas_Object* switchOf() {
-        Elm_Object_Item* const item = row<RowClass>()->getElmObjectItem();
+        Elm_Object_Item* const item = rowOf<RowClass>()->getElmObjectItem();
         stage().showRow(item);
         for (const Row& shown : Stage::rows(genlist())) {
             if (shown.item != item)
@@ -98,12 +82,6 @@ protected:
             }
         }
         return nullptr;
-    }
-
-    void chooseType(const std::string& label) {
-        tapRow<AlarmTypeItem>();
-        stage().tapText(label);
-        stage().settle();
     }
 
     static ClockAlarmDbData alarmOfType(int type) {
@@ -193,10 +171,10 @@ TEST_F(EditorRowsTest, ChoosingTypesBackAndForthKeepsTheOrder) {
 
 TEST_F(EditorRowsTest, ChoosingAmongTypesWithSoundKeepsTheRows) {
     createAlarm();
-    auto* const rising = row<AlarmIncreaseVolumeItem>();
+    auto* const rising = rowOf<AlarmIncreaseVolumeItem>();
     for (const char* label : {"Vibration and sound", "Sound", "Sound"}) {
         chooseType(label);
-        EXPECT_EQ(row<AlarmIncreaseVolumeItem>(), rising);
+        EXPECT_EQ(rowOf<AlarmIncreaseVolumeItem>(), rising);
         EXPECT_EQ(kinds(), SOUND_ROWS);
         EXPECT_THAT(textsOf<AlarmTypeItem>(), ElementsAre("Alarm type", label));
     }
@@ -205,10 +183,10 @@ TEST_F(EditorRowsTest, ChoosingAmongTypesWithSoundKeepsTheRows) {
 TEST_F(EditorRowsTest, ChoosingVibrationAgainKeepsTheRows) {
     editAlarm(alarmOfType(1));
     errorLines();
-    auto* const snooze = row<AlarmSnoozeItem>();
+    auto* const snooze = rowOf<AlarmSnoozeItem>();
     chooseType("Vibration");
     EXPECT_EQ(kinds(), SILENT_ROWS);
-    EXPECT_EQ(row<AlarmSnoozeItem>(), snooze);
+    EXPECT_EQ(rowOf<AlarmSnoozeItem>(), snooze);
 }
 
 TEST_F(EditorRowsTest, ARisingVolumeSurvivesAWhileWithoutItsRow) {
@@ -232,12 +210,12 @@ TEST_F(EditorRowsTest, TheBackKeyInTheTypePopupKeepsTheType) {
 
 TEST_F(EditorRowsTest, ADoubleTapOnTheTypeRowOpensOnePopup) {
     createAlarm();
-    stage().showRow(row<AlarmTypeItem>()->getElmObjectItem());
+    stage().showRow(rowOf<AlarmTypeItem>()->getElmObjectItem());
     const int before = liveControllers();
     const Spot spot = stage().findText("Alarm type")->area.middle();
     stage().tap(spot);
     EXPECT_EQ(liveControllers(), before + 1);
-    row<AlarmTypeItem>()->onSelect(row<AlarmTypeItem>()->getElmObjectItem());
+    rowOf<AlarmTypeItem>()->onSelect(rowOf<AlarmTypeItem>()->getElmObjectItem());
     EXPECT_EQ(liveControllers(), before + 1);
     stage().settle();
     stage().backKey();
@@ -324,14 +302,14 @@ TEST_F(EditorRowsTest, WithoutDaysTheDateLineTellsTheDateAgain) {
 
 TEST_F(EditorRowsTest, ADoubleTapOnTheRepeatRowOpensOneScreen) {
     createAlarm();
-    stage().showRow(row<AlarmRepeatItem>()->getElmObjectItem());
+    stage().showRow(rowOf<AlarmRepeatItem>()->getElmObjectItem());
     const int before = liveControllers();
     const Spot spot = stage().findText("Repeat weekly")->area.middle();
     stage().tap(spot);
     stage().tap(spot);
     stage().settle();
     EXPECT_EQ(liveControllers(), before + 1);
-    row<AlarmRepeatItem>()->onSelect(nullptr);
+    rowOf<AlarmRepeatItem>()->onSelect(nullptr);
     stage().settle();
     EXPECT_EQ(liveControllers(), before + 1);
     stage().backKey();

@@ -2,8 +2,6 @@
 
 #include <cstdlib>
 
-#include "AlarmTypeItem.h"
-
 namespace {
 
 // The toolkit knows these from the X server, which the tests do without.
@@ -64,12 +62,6 @@ int VolumeFixture::savedLevel() {
     const auto alarms = storedAlarms();
     EXPECT_EQ(alarms.size(), 1U);
     return alarms.empty() ? -1 : alarms.front().volume;
-}
-
-void VolumeFixture::chooseType(const std::string& label) {
-    tapRow<AlarmTypeItem>();
-    stage().tapText(label);
-    stage().settle();
 }
 
 void VolumeFixture::quickPanel(bool open) {

@@ -37,25 +37,6 @@ protected:
     int savedLevel();
     SliderHand& hand() { return _hand ? *_hand : _hand.emplace(stage()); }
 
-    /** Chooses an alert type by its label. */
-    void chooseType(const std::string& label);
-    /** Goes to a row and taps it. */
-    template <class RowClass>
-    void tapRow() {
-        stage().tapRow(rowOf<RowClass>()->getElmObjectItem());
-        stage().settle();
-    }
-    template <class RowClass>
-    RowClass* rowOf() {
-        for (Elm_Object_Item* item = elm_genlist_first_item_get(genlist()); item;
-             item = elm_genlist_item_next_get(item)) {
-            if (auto* found = dynamic_cast<RowClass*>(
-                    static_cast<app_assist::WGenlistItem*>(elm_object_item_data_get(item))))
-                return found;
-        }
-        return nullptr;
-    }
-
     /** Opens or closes the quick panel. */
     void quickPanel(bool open);
     /** Sends the editor's window some client message. */
