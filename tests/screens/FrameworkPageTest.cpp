@@ -4,6 +4,8 @@
 #include <functional>
 #include <string>
 
+#include <gmock/gmock.h>
+
 #include "app_assist/WUiTimer.h"
 #include "app_assist/WWindowController.h"
 #include "clock/ClockEventListener.h"
@@ -292,7 +294,7 @@ TEST_F(FrameworkPageTest, destroyingAPageThatSlidesOutConfusesNotTheToolkit) {
     page->destroy();
     stage().advance(TRANSITION);
     takeStageDown();
-    EXPECT_EQ(errors.count(), 0);
+    EXPECT_THAT(errors.lines(), testing::IsEmpty());
 }
 
 TEST_F(FrameworkPageTest, allPagesMayBeDestroyedInOneTurn) {
@@ -306,7 +308,7 @@ TEST_F(FrameworkPageTest, allPagesMayBeDestroyedInOneTurn) {
         stage().advance(TRANSITION);
         EXPECT_EQ(count("A gone"), 1);
         EXPECT_EQ(count("B gone"), 1);
-        EXPECT_EQ(errors.count(), 0);
+        EXPECT_THAT(errors.lines(), testing::IsEmpty());
     }
     EXPECT_EQ(items(), 0U);
     push("C");

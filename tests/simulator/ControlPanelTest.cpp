@@ -20,6 +20,7 @@
 #include "device/dlog.h"
 #include "device_host.h"
 #include "support/ScreenTest.h"
+#include "support/ToolkitErrors.h"
 #include "support/VirtualClock.h"
 
 using testing::ElementsAre;
@@ -183,6 +184,20 @@ TEST_F(ControlPanelTest, aClickSoonAfterAnotherOneEntersAFieldToo) {
     }
     EXPECT_EQ(setting("db/menu_widget/regionformat"), "tr_TR");
     EXPECT_EQ(device().callsTo("vconf_set_str").size(), 3U) << "what was there was not replaced";
+}
+
+TEST_F(ControlPanelTest, aClickIntoAFieldSelectsWhatItHolds) {
+    const ToolkitErrors errors;
+    hand->type("Region", "ko_KR");
+    hand->key("Return", "\n");
+    hand->click("Motion");
+    hand->click("Region", 0.2); // NOLINT(readability-magic-numbers)
+    const char* const selection = elm_entry_selection_get(hand->widget("Region"));
+    EXPECT_STREQ(selection, "ko_KR");
+    hand->write("de_DE");
+    hand->key("Return", "\n");
+    EXPECT_EQ(setting("db/menu_widget/regionformat"), "de_DE");
+    EXPECT_THAT(errors.lines(), testing::IsEmpty());
 }
 
 TEST_F(ControlPanelTest, buttonsMayBeClickedQuickly) {

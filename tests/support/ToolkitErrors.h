@@ -4,26 +4,35 @@
  */
 #pragma once
 
+#include <array>
 #include <cstdarg>
+#include <cstddef>
+#include <cstdio>
+#include <string>
+#include <vector>
 
 #include <Eina.h>
 
-/** Counts what the toolkit complains about while it lives. */
+/** Keeps the toolkit's error lines while it lives. */
 class ToolkitErrors {
 public:
     ToolkitErrors() { eina_log_print_cb_set(logCb, this); }
     ~ToolkitErrors() { eina_log_print_cb_set(eina_log_print_cb_stderr, nullptr); }
     ToolkitErrors(const ToolkitErrors&) = delete;
     ToolkitErrors& operator=(const ToolkitErrors&) = delete;
-    int count() const { return _count; }
+    const std::vector<std::string>& lines() const { return _lines; }
+    std::size_t count() const { return _lines.size(); }
 
 private:
     static void logCb(const Eina_Log_Domain* /*domain*/, Eina_Log_Level level, const char* /*file*/,
-                      const char* /*function*/, int /*line*/, const char* /*format*/, void* data,
-                      va_list /*arguments*/) {
-        if (level <= EINA_LOG_LEVEL_ERR) {
-            ++static_cast<ToolkitErrors*>(data)->_count;
-        }
+                      const char* function, int /*line*/, const char* format, void* data,
+                      va_list arguments) {
+        if (level > EINA_LOG_LEVEL_ERR)
+            return;
+        std::array<char, 256> text{};
+        std::vsnprintf(text.data(), text.size(), format, arguments);
+        static_cast<ToolkitErrors*>(data)->_lines.push_back(std::string(function) + ": " +
+                                                            text.data());
     }
-    int _count = 0;
+    std::vector<std::string> _lines;
 };
