@@ -13,6 +13,7 @@
 
 #include <benchmark/benchmark.h>
 
+#include "RatioReporter.h"
 #include "device/dlog.h"
 #include "device/i18n.h"
 #include "rules/CatalogueForTest.h"
@@ -151,46 +152,22 @@ void registerBenchmarks(const char* language, int count) {
     });
 }
 
-/** Keeps the single results, for the ratios. */
-class RatioReporter : public benchmark::ConsoleReporter {
-public:
-    RatioReporter() : ConsoleReporter(OO_Tabular) {}
-
-    void ReportRuns(const std::vector<Run>& runs) override {
-        for (const Run& run : runs) {
-            if (run.run_type == Run::RT_Iteration && !run.error_occurred)
-                _times[run.run_name.function_name].push_back(run.GetAdjustedRealTime());
-        }
-        ConsoleReporter::ReportRuns(runs);
-    }
-
-    void printRatios(const char* language, int count) {
-        const auto texts = static_cast<double>(std::size(TYPED));
-        const double filterPlain = timeOf(FILTER_PLAIN, language, count) / texts;
-        const double filter = timeOf(FILTER, language, count) / texts;
-        const double sortPlain = timeOf(SORT_PLAIN, language, count);
-        const double sort = timeOf(SORT, language, count);
-        if (filter <= 0 || sort <= 0)
-            return;
-        std::printf("%s %6d cities: one text %9.3f ms / %7.4f ms = %6.0f times faster; "
-                    "sort %8.2f ms / %7.2f ms = %5.1f times faster; prepared once in %6.2f ms\n",
-                    language, count, filterPlain, filter, filterPlain / filter, sortPlain, sort,
-                    sortPlain / sort, timeOf(PREPARE, language, count));
-    }
-
-private:
-    /** The median. */
-    double timeOf(const char* what, const char* language, int count) {
-        auto& times = _times[nameOf(what, language, count)];
-        if (times.empty())
-            return 0;
-        const auto middle = times.begin() + static_cast<std::ptrdiff_t>(times.size() / 2);
-        std::nth_element(times.begin(), middle, times.end());
-        return *middle;
-    }
-
-    std::map<std::string, std::vector<double>> _times;
-};
+void printRatios(RatioReporter& reporter, const char* language, int count) {
+    const auto timeOf = [&](const char* what) {
+        return reporter.medianOf(nameOf(what, language, count));
+    };
+    const auto texts = static_cast<double>(std::size(TYPED));
+    const double filterPlain = timeOf(FILTER_PLAIN) / texts;
+    const double filter = timeOf(FILTER) / texts;
+    const double sortPlain = timeOf(SORT_PLAIN);
+    const double sort = timeOf(SORT);
+    if (filter <= 0 || sort <= 0)
+        return;
+    std::printf("%s %6d cities: one text %9.3f ms / %7.4f ms = %6.0f times faster; "
+                "sort %8.2f ms / %7.2f ms = %5.1f times faster; prepared once in %6.2f ms\n",
+                language, count, filterPlain, filter, filterPlain / filter, sortPlain, sort,
+                sortPlain / sort, timeOf(PREPARE));
+}
 
 /** Asks for every text in every city. @return 1 when an answer differs from the plain one. */
 int compareAnswers(const char* language) {
@@ -235,7 +212,7 @@ int main(int argc, char** argv) {
     std::printf("\n");
     for (const char* language : LANGUAGES) {
         for (const int count : SIZES)
-            reporter.printRatios(language, count);
+            printRatios(reporter, language, count);
     }
     return 0;
 }

@@ -1,11 +1,9 @@
 // How long the alarm editor takes to open, beside the plainest page the toolkit can show, and what
 // it costs while nobody touches it.
 
-#include <algorithm>
 #include <cstdio>
 #include <cstdlib>
 #include <filesystem>
-#include <map>
 #include <memory>
 #include <string>
 #include <vector>
@@ -16,6 +14,7 @@
 #include <benchmark/benchmark.h>
 
 #include "AlarmEditViewController.h"
+#include "RatioReporter.h"
 #include "SkippedTime.h"
 #include "app_assist/WNaviframeController.h"
 #include "app_assist/WWindowController.h"
@@ -112,44 +111,6 @@ void openBarePage(benchmark::State& state) {
     }
 }
 
-/** Keeps the single results, for the ratio. */
-class RatioReporter : public benchmark::ConsoleReporter {
-public:
-    RatioReporter() : ConsoleReporter(OO_Tabular) {}
-
-    void ReportRuns(const std::vector<Run>& runs) override {
-        for (const Run& run : runs) {
-            _failed = _failed || run.error_occurred;
-            if (run.run_type == Run::RT_Iteration)
-                _times[run.run_name.function_name].push_back(run.GetAdjustedRealTime());
-        }
-        ConsoleReporter::ReportRuns(runs);
-    }
-
-    /** @return False when there is nothing to compare. */
-    bool printRatio() {
-        const double bare = median(_times[BARE_PAGE]);
-        const double editor = median(_times[EDITOR]);
-        if (_failed || bare <= 0 || editor <= 0)
-            return false;
-        std::printf("\nOpening, medians: %s %.2f ms, %s %.2f ms, ratio %.2f\n", EDITOR, editor,
-                    BARE_PAGE, bare, editor / bare);
-        return true;
-    }
-
-private:
-    static double median(std::vector<double> times) {
-        if (times.empty())
-            return 0;
-        const auto middle = times.begin() + static_cast<std::ptrdiff_t>(times.size() / 2);
-        std::nth_element(times.begin(), middle, times.end());
-        return *middle;
-    }
-
-    std::map<std::string, std::vector<double>> _times;
-    bool _failed = false;
-};
-
 Eina_Bool quitCb(void*) {
     ecore_main_loop_quit();
     return ECORE_CALLBACK_CANCEL;
@@ -185,7 +146,7 @@ int measure(int argc, char** argv) {
         bench->Iterations(5)->UseRealTime()->Unit(benchmark::kMillisecond);
     RatioReporter reporter;
     benchmark::RunSpecifiedBenchmarks(&reporter);
-    const bool compared = reporter.printRatio();
+    const bool compared = reporter.printRatio("Opening", EDITOR, BARE_PAGE);
     measureIdleMinute();
     return compared ? EXIT_SUCCESS : EXIT_FAILURE;
 }

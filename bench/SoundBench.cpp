@@ -7,7 +7,6 @@
 #include <cstdio>
 #include <cstdlib>
 #include <filesystem>
-#include <map>
 #include <optional>
 #include <string>
 #include <vector>
@@ -18,6 +17,7 @@
 #include <poll.h>
 #include <unistd.h>
 
+#include "RatioReporter.h"
 #include "clock/ClockAlarmDbData.h"
 #include "clock/ClockSoundPlayer.h"
 #include "device/dlog.h"
@@ -135,44 +135,6 @@ void plainPlayer(benchmark::State& state) {
 BENCHMARK(preview)->Name(PREVIEW)->Iterations(5)->UseManualTime()->Unit(benchmark::kMillisecond);
 BENCHMARK(plainPlayer)->Name(PLAIN)->Iterations(5)->UseManualTime()->Unit(benchmark::kMillisecond);
 
-/** Keeps the single results, for the ratio. */
-class RatioReporter : public benchmark::ConsoleReporter {
-public:
-    RatioReporter() : ConsoleReporter(OO_Tabular) {}
-
-    void ReportRuns(const std::vector<Run>& runs) override {
-        for (const Run& run : runs) {
-            _failed = _failed || run.error_occurred;
-            if (run.run_type == Run::RT_Iteration)
-                _times[run.run_name.function_name].push_back(run.GetAdjustedRealTime());
-        }
-        ConsoleReporter::ReportRuns(runs);
-    }
-
-    /** @return False when there is nothing to compare. */
-    bool printRatio() {
-        const double mine = median(_times[PREVIEW]);
-        const double plain = median(_times[PLAIN]);
-        if (_failed || mine <= 0 || plain <= 0)
-            return false;
-        std::printf("\nFrom the touch to the sound, medians: %s %.2f ms, %s %.2f ms, ratio %.2f\n",
-                    PREVIEW, mine, PLAIN, plain, mine / plain);
-        return true;
-    }
-
-private:
-    static double median(std::vector<double> times) {
-        if (times.empty())
-            return 0;
-        const auto middle = times.begin() + static_cast<std::ptrdiff_t>(times.size() / 2);
-        std::nth_element(times.begin(), middle, times.end());
-        return *middle;
-    }
-
-    std::map<std::string, std::vector<double>> _times;
-    bool _failed = false;
-};
-
 /** GStreamer starts with the first sound of a process. @return False when nothing was heard. */
 bool measureFirst() {
     using Milliseconds = std::chrono::duration<double, std::milli>;
@@ -206,7 +168,7 @@ int measure(int argc, char** argv) {
         return EXIT_FAILURE;
     RatioReporter reporter;
     benchmark::RunSpecifiedBenchmarks(&reporter);
-    const bool compared = reporter.printRatio();
+    const bool compared = reporter.printRatio("From the touch to the sound", PREVIEW, PLAIN);
     return compared ? EXIT_SUCCESS : EXIT_FAILURE;
 }
 
