@@ -2,14 +2,7 @@
 # Sourced by the journeys that use the watch with a pointer and keys.
 # usage: . journey.sh CLOCK_SIM PICTURE_DIRECTORY
 # shellcheck disable=SC2034 # variables of the journeys
-journeys=$(cd "$(dirname "${BASH_SOURCE[0]}")" && pwd) || exit 1
-. "$journeys/check.sh"
-. "$journeys/../../scripts/watch.sh"
-simulator=$1 pictures=$2
-check_environment
-export TZ=Europe/Berlin
-trap 'watch_end; rm -rf "$work"' EXIT
-rm -rf "$pictures" && mkdir -p "$pictures" || exit 1
+. "$(dirname "${BASH_SOURCE[0]}")/begin.sh" "$@"
 database=$work/data/clock.db log=$pictures/clock-sim.log
 
 starts() { watch_start "$log" "$simulator" --data "$work/data" --24h "$@"; }

@@ -3,14 +3,7 @@
 # Another language is chosen while applications are open that are processes of their own, and while
 # a screen shows times in the form of a region.
 set -u
-here=$(cd "$(dirname "${BASH_SOURCE[0]}")" && pwd) || exit 1
-. "$here/check.sh"
-. "$here/../../scripts/watch.sh"
-simulator=$1 pictures=$2
-check_environment
-export TZ=Europe/Berlin
-trap 'watch_end; rm -rf "$work"' EXIT
-rm -rf "$pictures" && mkdir -p "$pictures" || exit 1
+. "$(dirname "${BASH_SOURCE[0]}")/begin.sh" "$@"
 cd "$pictures" || exit 1
 
 # scripted NAME ARGUMENT...: runs the script of the standard input on a watch of its own.

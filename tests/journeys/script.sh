@@ -2,14 +2,7 @@
 # usage: script.sh CLOCK_SIM PICTURE_DIRECTORY
 # Scripts and commands: what they do to a watch without a display, and how they fail.
 set -u
-here=$(cd "$(dirname "${BASH_SOURCE[0]}")" && pwd) || exit 1
-. "$here/check.sh"
-. "$here/../../scripts/watch.sh"
-simulator=$1 pictures=$2
-check_environment
-export TZ=Europe/Berlin
-trap 'watch_end; rm -rf "$work"' EXIT
-rm -rf "$pictures" && mkdir -p "$pictures" || exit 1
+. "$(dirname "${BASH_SOURCE[0]}")/begin.sh" "$@"
 data=$work/data
 
 # runs STATUS ARGUMENT...: runs the simulator; what it prints is in $out and $err afterwards.

@@ -3,14 +3,9 @@
 # A tone is picked for an alarm: from the editor's row to the tone picker, a program of its own, and back.
 # shellcheck disable=SC2086 # a place of watch.sh is two words: x and y
 set -u
-here=$(cd "$(dirname "${BASH_SOURCE[0]}")" && pwd) || exit 1
-. "$here/check.sh"
-. "$here/../../scripts/watch.sh"
-simulator=$1 pictures=$2
-check_environment
-export TZ=Europe/Berlin CLOCK_TONE_DIR=$work/tones
-trap 'watch_end; rm -rf "$work"' EXIT
-rm -rf "$pictures" && mkdir -p "$pictures" "$work/tones" || exit 1
+. "$(dirname "${BASH_SOURCE[0]}")/begin.sh" "$@"
+export CLOCK_TONE_DIR=$work/tones
+mkdir "$work/tones" || exit 1
 database=$work/data/clock.db log=$pictures/clock-sim.log
 folder=/opt/usr/share/settings/Ringtones
 
