@@ -579,16 +579,3 @@ TEST_F(RemoteFaceTest, ofTwoThingsOnTheFaceTheUpperOneCovers) {
     for (Evas_Object* object : {upper, lower, text})
         evas_object_del(object);
 }
-
-TEST_F(RemoteFaceTest, aWindowOfAnotherSizeIsNoFace) {
-    Evas_Object* panel = elm_win_add(nullptr, "panel", ELM_WIN_BASIC);
-    evas_object_resize(panel, 400, 600);
-    evas_object_show(panel);
-    ecore_evas_focus_set(ecore_evas_ecore_evas_get(evas_object_evas_get(panel)), EINA_TRUE);
-    Stage::frames(3);
-    const auto size = ask({"picture"}).values;
-    ASSERT_EQ(size.size(), 3U);
-    EXPECT_EQ(size[0], "360");
-    EXPECT_EQ(size[1], "360");
-    evas_object_del(panel);
-}
