@@ -92,14 +92,14 @@ int __dlog_print(log_id_t /*id*/, int priority, const char* tag, const char* for
     va_end(arguments);
     if (!formatted)
         return -1;
-    tellListener(priority, tag, message);
-    if (!isatty(STDERR_FILENO))
-        removeColours(message);
     std::string line = std::string(tag) + " " + message;
+    if (!isatty(STDERR_FILENO))
+        removeColours(line);
     keepOnOneLine(line);
     line += '\n';
-    // One write: lines of several processes do not mix.
+    // One write: lines of several processes do not mix. Whoever is told finds it written.
     const ssize_t written = write(STDERR_FILENO, line.data(), line.size());
+    tellListener(priority, tag, message);
     errno = savedError;
     return written < 0 ? -1 : static_cast<int>(written);
 }
