@@ -175,6 +175,11 @@ Evas_Object* addRadio(Evas_Object* row, const char* label, const std::string& na
 
 namespace {
 
+Eina_Bool selectAllCb(void* field, Evas*) {
+    elm_entry_select_all(static_cast<Evas_Object*>(field));
+    return EINA_TRUE;
+}
+
 /** The toolkit takes a click soon after any other one for the half of a double click alone. */
 void enterCb(void*, Evas*, Evas_Object* field, void* info) {
     if (static_cast<Evas_Event_Mouse_Up*>(info)->flags != EVAS_BUTTON_NONE &&
@@ -189,10 +194,10 @@ void selectWhenEntered(Evas_Object* field) {
         evas_object_data_set(field, ENTERED, field);
         elm_entry_select_all(field);
     });
-    // The click that has brought the focus has put the cursor where it was.
+    // The click that has brought the focus puts the cursor where it was, once all have heard of it.
     onEvent(field, "clicked", [field] {
         if (evas_object_data_del(field, ENTERED) != nullptr)
-            elm_entry_select_all(field);
+            evas_post_event_callback_push(evas_object_evas_get(field), selectAllCb, field);
     });
     onEvent(field, "unfocused", [field] {
         evas_object_data_del(field, ENTERED);
