@@ -17,7 +17,6 @@ namespace {
 using Lines = std::vector<std::string>;
 using testing::Contains;
 using testing::ElementsAre;
-using testing::IsEmpty;
 using testing::Not;
 using testing::StartsWith;
 

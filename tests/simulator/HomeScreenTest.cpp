@@ -100,8 +100,8 @@ TEST_F(HomeScreenTest, theTimeStandsInTheMiddleBelowToasts) {
     Stage::frames(2);
     const auto time = stage().findText("09:41");
     ASSERT_TRUE(time);
-    EXPECT_NEAR(time->area.middle().x, Stage::SIZE / 2, 1);
-    EXPECT_NEAR(time->area.middle().y, Stage::SIZE / 2, 1);
+    EXPECT_NEAR(time->area.middle().x, Stage::SIZE / 2.0, 1);
+    EXPECT_NEAR(time->area.middle().y, Stage::SIZE / 2.0, 1);
     Evas_Object* toast = evas_object_rectangle_add(stage().canvas());
     evas_object_color_set(toast, 255, 0, 0, 255);
     evas_object_resize(toast, Stage::SIZE, Stage::SIZE);

@@ -2,9 +2,11 @@
 
 #include "script/VisibleTexts.h"
 
+#include <cstdlib>
 #include <string>
 #include <vector>
 
+#include <Eina.h>
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
@@ -29,6 +31,15 @@ const std::vector<VisibleText> EDITOR{
     at("Alarm name", 120, 240), at("Sound the\nalarm 3 times", 150, 300),
 };
 
+std::string inUtf8(Eina_Unicode character) {
+    const Eina_Unicode text[] = {character, 0};
+    int length = 0;
+    char* bytes = eina_unicode_unicode_to_utf8(text, &length);
+    std::string result(bytes, static_cast<std::size_t>(length));
+    std::free(bytes);
+    return result;
+}
+
 } // namespace
 
 TEST(ScriptTexts, WhiteSpaceCountsAsPeopleReadIt) {
@@ -42,11 +53,12 @@ TEST(ScriptTexts, WhiteSpaceCountsAsPeopleReadIt) {
 
 TEST(ScriptTexts, MarksOfDirectionAreNotCompared) {
     // Marks, embeddings, overrides and isolates, with their ends.
-    for (const char* const mark : {"\u200E", "\u200F", "\u061C", "\u202A", "\u202B", "\u202C",
-                                   "\u202D", "\u202E", "\u2066", "\u2067", "\u2068", "\u2069"}) {
-        const std::string m = mark;
-        for (const std::string& drawn :
-             {m + "Yoga", "Yoga" + m, "Yo" + m + "ga", m + " Yoga " + m, m + m + "Yoga" + m}) {
+    for (const Eina_Unicode mark : {0x200E, 0x200F, 0x061C, 0x202A, 0x202B, 0x202C, 0x202D, 0x202E,
+                                    0x2066, 0x2067, 0x2068, 0x2069}) {
+        const std::string m = inUtf8(mark);
+        for (std::string drawn : {"*Yoga", "Yoga*", "Yo*ga", "* Yoga *", "**Yoga*"}) {
+            for (auto gap = drawn.find('*'); gap != std::string::npos; gap = drawn.find('*'))
+                drawn.replace(gap, 1, m);
             SCOPED_TRACE(testing::PrintToString(drawn));
             EXPECT_EQ(asRead(drawn), "Yoga");
             const std::vector<VisibleText> face{at("Yoga today", 90, 40), at(drawn, 150, 90)};
