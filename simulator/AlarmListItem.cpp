@@ -108,11 +108,14 @@ std::string AlarmListItem::textOf(const std::string& part) const {
 
 std::string AlarmListItem::aboutMarkup() const {
     const bool on = isOn();
-    const std::string days = lineMarkup(alarmDaysText(_alarm, std::time(nullptr)));
-    std::string about = on ? days : tagged("off", days);
+    const std::string days = alarmDaysText(_alarm, std::time(nullptr));
+    // The day may stand above the time already.
+    const std::string when = days == _look.next ? "" : lineMarkup(days);
+    std::string about = on ? when : tagged("off", when);
     if (_alarm.name.empty())
         return about;
-    return tagged(on ? "label" : "label_off", lineMarkup(_alarm.name)) + "<br>" + about;
+    std::string name = tagged(on ? "label" : "label_off", lineMarkup(_alarm.name));
+    return about.empty() ? name : name + "<br>" + about;
 }
 
 Evas_Object* AlarmListItem::_contentGetCb(void* data, Evas_Object* genlist, const char* part) {

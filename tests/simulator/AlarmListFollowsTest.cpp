@@ -1,5 +1,6 @@
 // The list of alarms follows the clock, and stands still under a finger.
 
+#include <cstdint>
 #include <string>
 #include <vector>
 
@@ -72,6 +73,22 @@ TEST_F(AlarmListFollowsTest, theNextAlarmTellsHowFarAwayItIs) {
     const auto next = stage().findText("in 2 hr, 19 min");
     ASSERT_TRUE(next);
     EXPECT_LT(next->area.y, placeOf("12:00").y);
+}
+
+TEST_F(AlarmListFollowsTest, aDayThatStandsAboveTheTimeIsSaidOnce) {
+    const auto now = VirtualClock::now();
+    VirtualClock::setNow("Europe/Berlin", "2026-11-21 00:00:00");
+    ClockAlarmDbData alarm = alarmAt(10, 0);
+    alarm.autoDate = static_cast<std::int32_t>(VirtualClock::now());
+    VirtualClock::setNow(now);
+    alarm.manualDate = alarm.autoDate;
+    alarm.name = "Train";
+    add(alarm);
+    openPage();
+    const auto day = stage().findText("Sat, Nov 21");
+    ASSERT_TRUE(day) << readFace();
+    EXPECT_LT(day->area.y, placeOf("10:00").y);
+    EXPECT_TRUE(stage().shows("Train")) << "nothing below it: " << readFace();
 }
 
 TEST_F(AlarmListFollowsTest, theMarkMovesToTheAlarmThatIsNextNow) {
