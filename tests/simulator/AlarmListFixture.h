@@ -11,29 +11,18 @@
 #include <Elementary.h>
 
 #include "AlarmListViewController.h"
+#include "PageFixture.h"
 #include "base/SqliteDatabase.h"
 #include "clock/ClockAlarmDbModel.h"
 #include "clock/ClockAlarmManagerModel.h"
 #include "clock/ClockEventListener.h"
-#include "support/ScreenTest.h"
 #include "support/StoredData.h"
 
 /** @brief It is Wednesday, 18 November 2026, 09:41 in Berlin. */
-class AlarmListFixture : public ScreenTest {
+class AlarmListFixture : public PageFixture {
 protected:
     static constexpr int WEDNESDAY = 8;
 
-    void SetUp() override {
-        ScreenTest::SetUp();
-        elm_theme_extension_add(nullptr, theme().c_str());
-    }
-    void TearDown() override {
-        takeStageDown();
-        elm_theme_extension_del(nullptr, theme().c_str());
-        ScreenTest::TearDown();
-    }
-
-    static std::string theme() { return CLOCK_RESOURCE_DIR "/edje/simulator.edj"; }
     void openPage() {
         page = new simulator::AlarmListViewController(theme());
         stage().push(page);

@@ -9,6 +9,7 @@
 #include <gmock/gmock.h>
 
 #include "AlarmListViewController.h"
+#include "PageFixture.h"
 #include "QuickPanel.h"
 #include "WorldClockViewController.h"
 #include "clock/ClockAlarmDbModel.h"
@@ -16,7 +17,6 @@
 #include "support/FocusWalk.h"
 #include "support/ReadingSwitch.h"
 #include "support/ScreenReader.h"
-#include "support/ScreenTest.h"
 #include "support/StoredData.h"
 
 using simulator::AlarmListViewController;
@@ -30,22 +30,16 @@ namespace {
 
 using Names = std::vector<std::string>;
 
-const std::string THEME = CLOCK_RESOURCE_DIR "/edje/simulator.edj";
 constexpr const char* KATHMANDU = "IDS_CITY_NP_KATHMANDU";
 constexpr const char* SINGAPORE = "IDS_CITY_SG_SINGAPORE";
 
-class PagesTest : public ScreenTest {
+class PagesTest : public PageFixture {
 protected:
-    void SetUp() override {
-        ScreenTest::SetUp();
-        elm_theme_extension_add(nullptr, THEME.c_str());
-    }
     void TearDown() override {
         takeStageDown();
-        elm_theme_extension_del(nullptr, THEME.c_str());
         // What the editor and the city picker tell of themselves is their own affair.
         takeErrors();
-        ScreenTest::TearDown();
+        PageFixture::TearDown();
     }
     static void storeNamed(int hour, int minute, const std::string& name, bool on) {
         constexpr int MONDAY = 2;
@@ -57,12 +51,12 @@ protected:
     void openAlarms() {
         // An alarm that rings next would begin with the time until then.
         storeNamed(7, 30, "Gym", false);
-        stage().push(new AlarmListViewController(THEME));
+        stage().push(new AlarmListViewController(theme()));
     }
     void openCities() {
         storeCity(KATHMANDU, 0);
         storeCity(SINGAPORE, 1);
-        stage().push(new WorldClockViewController(THEME));
+        stage().push(new WorldClockViewController(theme()));
     }
     static Names selected() {
         std::vector<ClockWorldClockDbData> cities;
@@ -208,7 +202,7 @@ TEST_F(ReadPagesTest, TheWorldClockIsReadAndItsPopupByItsTitle) {
 
 TEST_F(ReadPagesTest, TheQuickPanelSaysTheVolumeWhileItIsDown) {
     device().setVolume(SOUND_TYPE_ALARM, 7);
-    auto panel = std::make_unique<QuickPanel>(stage().window(), THEME, [](bool) {});
+    auto panel = std::make_unique<QuickPanel>(stage().window(), theme(), [](bool) {});
     const auto said = [this] {
         return ScreenReader::announced(stage().window());
     };
@@ -238,17 +232,17 @@ INSTANTIATE_TEST_SUITE_P(Languages, ReadPagesSwitchTest, languageChanges(),
 TEST_P(ReadPagesSwitchTest, TheAlarmListsRowsSwitchesAndButtons) {
     storeNamed(7, 30, "Gym", false);
     storeNamed(22, 45, "", true);
-    expectTheSame([this] { stage().push(new AlarmListViewController(THEME)); });
+    expectTheSame([this] { stage().push(new AlarmListViewController(theme())); });
 }
 
 TEST_P(ReadPagesSwitchTest, TheWordsThatThereAreNoAlarms) {
-    expectTheSame([this] { stage().push(new AlarmListViewController(THEME)); });
+    expectTheSame([this] { stage().push(new AlarmListViewController(theme())); });
 }
 
 TEST_P(ReadPagesSwitchTest, TheQuestionBeforeAnAlarmGoes) {
     storeNamed(7, 30, "Gym", false);
     expectTheSame([this] {
-        stage().push(new AlarmListViewController(THEME));
+        stage().push(new AlarmListViewController(theme()));
         const auto time = stage().findText("07:30");
         ASSERT_TRUE(time);
         stage().press(time->area.middle().x, time->area.middle().y);
@@ -262,7 +256,7 @@ TEST_P(ReadPagesSwitchTest, TheWorldClocksRowsAndButtons) {
 }
 
 TEST_P(ReadPagesSwitchTest, TheWordsThatThereAreNoCities) {
-    expectTheSame([this] { stage().push(new WorldClockViewController(THEME)); });
+    expectTheSame([this] { stage().push(new WorldClockViewController(theme())); });
 }
 
 TEST_P(ReadPagesSwitchTest, TheQuestionBeforeACityGoes) {
@@ -275,7 +269,7 @@ TEST_P(ReadPagesSwitchTest, TheQuestionBeforeACityGoes) {
 TEST_P(ReadPagesSwitchTest, TheQuickPanelsVolume) {
     device().setVolume(SOUND_TYPE_ALARM, 7);
     language().choose("en");
-    QuickPanel panel(stage().window(), THEME, [](bool) {});
+    QuickPanel panel(stage().window(), theme(), [](bool) {});
     panel.toggle();
     Stage::advance(0.5);
     language().choose("de");

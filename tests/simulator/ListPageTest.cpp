@@ -6,11 +6,10 @@
 
 #include <gtest/gtest.h>
 
-#include "support/ScreenTest.h"
+#include "PageFixture.h"
 
 namespace {
 
-const std::string THEME = CLOCK_RESOURCE_DIR "/edje/simulator.edj";
 constexpr double MINUTE = 60;
 constexpr simulator::ListPageTexts TEXTS{"IDS_COM_BODY_ALARM", "IDS_COM_BODY_ALARM",
                                          "IDS_COM_BODY_ALARM", "IDS_COM_BODY_ALARM"};
@@ -18,7 +17,8 @@ constexpr simulator::ListPageTexts TEXTS{"IDS_COM_BODY_ALARM", "IDS_COM_BODY_ALA
 /** A list without rows that counts minutes. */
 class MinutePage : public simulator::ListPage {
 public:
-    explicit MinutePage(int& minutes) : ListPage(THEME, TEXTS), _minutes(minutes) {}
+    MinutePage(const std::string& theme, int& minutes)
+        : ListPage(theme, TEXTS), _minutes(minutes) {}
 
 protected:
     Elm_Object_Item* appendRows() override { return nullptr; }
@@ -30,29 +30,18 @@ private:
     int& _minutes;
 };
 
-class ListPageTest : public ScreenTest {
-protected:
-    void SetUp() override {
-        ScreenTest::SetUp();
-        elm_theme_extension_add(nullptr, THEME.c_str());
-    }
-    void TearDown() override {
-        takeStageDown();
-        elm_theme_extension_del(nullptr, THEME.c_str());
-        ScreenTest::TearDown();
-    }
-};
+using ListPageTest = PageFixture;
 
 } // namespace
 
 TEST_F(ListPageTest, minutesPassOnlyOnThePageThatIsSeen) {
     int below = 0;
     int above = 0;
-    stage().push(new MinutePage(below));
+    stage().push(new MinutePage(theme(), below));
     // Not where a minute begins.
     Stage::advance(MINUTE + 10);
     EXPECT_EQ(below, 1);
-    auto* page = new MinutePage(above);
+    auto* page = new MinutePage(theme(), above);
     stage().push(page);
     Stage::advance(2 * MINUTE);
     EXPECT_EQ(below, 1) << "nobody sees it";

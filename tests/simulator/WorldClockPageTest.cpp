@@ -12,9 +12,9 @@
 #include <gmock/gmock.h>
 
 #include "AlarmListViewController.h"
+#include "PageFixture.h"
 #include "clock/ClockWorldClockDbModel.h"
 #include "screens/TestCatalogue.h"
-#include "support/ScreenTest.h"
 #include "support/StoredData.h"
 
 using simulator::AlarmListViewController;
@@ -25,7 +25,6 @@ using testing::HasSubstr;
 namespace {
 
 constexpr const char* TIME_FORM = "db/menu_widget/regionformat_time1224";
-const std::string THEME = CLOCK_RESOURCE_DIR "/edje/simulator.edj";
 constexpr const char* KATHMANDU = "IDS_CITY_NP_KATHMANDU";
 constexpr const char* HONOLULU = "IDS_CITY_US_HAWAII_HONOLULU";
 constexpr const char* SINGAPORE = "IDS_CITY_SG_SINGAPORE";
@@ -34,24 +33,19 @@ constexpr const char* SINGAPORE = "IDS_CITY_SG_SINGAPORE";
 const std::vector<std::string> TOLD = {"create genlist",
                                        "_callerType = ", "City selected :: ", "Hide keyboard"};
 
-class WorldClockPageTest : public ScreenTest {
+class WorldClockPageTest : public PageFixture {
 protected:
-    void SetUp() override {
-        ScreenTest::SetUp();
-        elm_theme_extension_add(nullptr, THEME.c_str());
-    }
     void TearDown() override {
         takeStageDown();
-        elm_theme_extension_del(nullptr, THEME.c_str());
         for (const std::string& line : takeErrors()) {
             EXPECT_TRUE(std::any_of(TOLD.begin(), TOLD.end(), [&](const auto& told) {
                 return line.starts_with(told);
             })) << line;
         }
-        ScreenTest::TearDown();
+        PageFixture::TearDown();
     }
 
-    void openPage() { stage().push(new WorldClockViewController(THEME)); }
+    void openPage() { stage().push(new WorldClockViewController(theme())); }
     static std::vector<std::string> selected() {
         std::vector<ClockWorldClockDbData> cities;
         ClockWorldClockDbModel().getWorldClockSelectedCityList(cities);
@@ -270,7 +264,7 @@ TEST_F(WorldClockPageTest, aDamagedListIsLoggedAndLooksEmpty) {
 }
 
 TEST_F(WorldClockPageTest, theTitlesButtonLeadsThereAndBack) {
-    stage().push(new AlarmListViewController(THEME));
+    stage().push(new AlarmListViewController(theme()));
     tapText("World clock");
     EXPECT_TRUE(stage().shows("No cities")) << readFace();
     tapText("Alarm");
